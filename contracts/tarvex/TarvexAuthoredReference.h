@@ -1,0 +1,18 @@
+#pragma once
+
+#include "contracts/platform/WString.h"
+
+#include <optional>
+#include <vector>
+
+/// A reference (part or sub-assembly) as a host or test describes it. Absent texts make
+/// the matching getters give no text.
+struct TarvexAuthoredReference {
+    unsigned int uniqueId = 0;
+    bool isPart = true;
+    std::optional<VizPort::WString> name;        ///< GetReferenceName
+    std::optional<VizPort::WString> storageName; ///< GetStorageName
+    /// Authoring ids of the instances below this reference, in order. Filled by
+    /// TarvexModel::AddInstance.
+    std::vector<unsigned int> instances;
+};

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "contracts/tarvex/TarvexInputPSInstance.h"
+#include "contracts/tarvex/TarvexLengthUnitType.h"
+#include "contracts/tarvex/TarvexWString.h"
+
+#include <memory>
+
+class TarvexModelData;
+
+/// The product tree of an import: the product's name and unit and its root instances.
+/// A default object is an empty product.
+class TarvexInputProductStructure {
+public:
+    TarvexInputProductStructure() = default;
+    explicit TarvexInputProductStructure(std::shared_ptr<TarvexModelData const> data)
+        : m_data(std::move(data)) {}
+
+    TarvexWString GetProductName() const;
+    int GetUniqueReferencesCount() const;
+    int GetRootInstancesCount() const;
+    /// The root instance at `index`; an empty instance when out of range.
+    TarvexInputPSInstance GetRootInstance(int index) const;
+    TarvexLengthUnitType GetUnits() const;
+
+private:
+    std::shared_ptr<TarvexModelData const> m_data;
+};

@@ -1,0 +1,66 @@
+#pragma once
+
+#include "contracts/tarvex/TarvexAuthoredDocument.h"
+#include "contracts/tarvex/TarvexAuthoredInstance.h"
+#include "contracts/tarvex/TarvexAuthoredReference.h"
+#include "contracts/tarvex/TarvexFaultPlan.h"
+#include "contracts/tarvex/TarvexLengthUnitType.h"
+
+#include <memory>
+#include <optional>
+
+class TarvexDocument;
+class TarvexInputProductStructure;
+class TarvexPSImportResult;
+class TarvexModelData;
+
+/// The in-memory document model behind the library's value objects, and the authoring API
+/// through which a host or test fills it. The value objects handed out share the model's
+/// data and keep it alive; authoring after they were handed out is seen by them.
+/// Not thread-safe while authoring; reading through value objects is.
+class TarvexModel {
+public:
+    TarvexModel();
+    ~TarvexModel();
+    TarvexModel(TarvexModel&&) noexcept;
+    TarvexModel& operator=(TarvexModel&&) noexcept;
+    TarvexModel(TarvexModel const&) = delete;
+    TarvexModel& operator=(TarvexModel const&) = delete;
+
+    // Product.
+    void SetProductName(std::optional<VizPort::WString> name);
+    void SetUnits(TarvexLengthUnitType unit);
+    /// Overrides GetUniqueReferencesCount, which otherwise counts the distinct references
+    /// reachable from the root instances.
+    void SetUniqueReferencesCount(std::optional<int> count);
+
+    /// Adds a reference and returns its record, which stays valid as long as the model.
+    /// A unique id that is already used replaces nothing: the existing record is returned.
+    TarvexAuthoredReference& AddPart(unsigned int uniqueId, std::optional<VizPort::WString> name,
+                                     std::optional<VizPort::WString> storageName = std::nullopt);
+    TarvexAuthoredReference& AddAssembly(unsigned int uniqueId,
+                                         std::optional<VizPort::WString> name,
+                                         std::optional<VizPort::WString> storageName = std::nullopt);
+    /// The record of a reference added before, or null.
+    TarvexAuthoredReference* FindReference(unsigned int uniqueId);
+
+    /// Places `referenceId` at the top of the product / below `parentId`. The reference
+    /// need not exist yet; an instance of an unknown reference gives an empty reference.
+    TarvexAuthoredInstance& AddRootInstance(unsigned int referenceId,
+                                            std::optional<VizPort::WString> name);
+    TarvexAuthoredInstance& AddInstance(unsigned int parentId, unsigned int referenceId,
+                                        std::optional<VizPort::WString> name);
+
+    TarvexAuthoredDocument& Document();
+    void AddMissingFile(std::optional<VizPort::WString> name);
+
+    TarvexFaultPlan& Faults();
+
+    // Value objects onto this model.
+    TarvexPSImportResult GetImportResult() const;
+    TarvexInputProductStructure GetInputProductStructure() const;
+    TarvexDocument GetDocument() const;
+
+private:
+    std::shared_ptr<TarvexModelData> m_data;
+};

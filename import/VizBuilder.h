@@ -1,0 +1,107 @@
+#pragma once
+
+#include "model/SemanticPMIMaps.h"
+#include "model/VizDocumentInfo.h"
+#include "model/VizTypes.h"
+
+#include <map>
+
+class TarvexDocument;
+class TarvexInputProductStructure;
+class TarvexInputPSReference;
+class TarvexPolicy;
+class TarvexPSImportResult;
+
+namespace VizBridgeTarvex {
+
+class VizModelerServices;
+class VizPartContainer;
+class VizProductStructure;
+class VizPSEntry;
+
+/// Builds a VizProductStructure from the import library's data.
+///
+/// The static MakeVizProductStructure forms create the structure and its instance tree and
+/// hand it to the host, which owns it from then on. A builder made on that structure then
+/// imports the data behind the tree with ImportAndBuildPS. The builder holds the structure,
+/// the input, the policy and the modeler services without owning any of them; it may be
+/// destroyed as soon as ImportAndBuildPS has returned.
+///
+/// Failures never show in a result: each becomes a text that
+/// VizProductStructure::GetErrorMessages gives. Exceptions of the import library stay inside,
+/// except in the instance tree of the assembly form when KolbaVizCore::GetAllowThrow() is on.
+class VizBuilder {
+public:
+    /// Progress of the import: `text` is null at the first and the last call.
+    using ProgressCallback = void (*)(int const& current, int const& total, char16_t const* text);
+
+    /// Assembly form: document strings, missing files and the whole instance tree.
+    /// `out` receives the new structure before the tree is built, so that with the throw
+    /// switch on an exception leaves it with the host, who then owns what was built.
+    static void MakeVizProductStructure(TarvexPSImportResult const& result,
+                                        TarvexInputProductStructure const& input,
+                                        TarvexDocument& document, VizProductStructure*& out);
+    /// One part around a container that the host already has; document strings from the
+    /// import library. The structure takes ownership of `container`.
+    static void MakeVizProductStructure(TarvexPSImportResult const& result,
+                                        TarvexInputProductStructure const& input,
+                                        TarvexDocument& document, VizPartContainer* container,
+                                        VizProductStructure*& out);
+    /// One part around a container, with document strings from the host and nothing from
+    /// the import library. A null container leaves `out` null and takes nothing.
+    static void MakeVizProductStructure(VizDocumentInfo const& info, VizPartContainer* container,
+                                        VizProductStructure*& out);
+
+    VizBuilder(VizProductStructure& structure, TarvexInputProductStructure const& input,
+               TarvexPolicy* policy);
+    VizBuilder(VizBuilder const&) = default;
+    ~VizBuilder() = default;
+
+    /// Runs the instance data, graphical data and assembly data phases, in this order.
+    /// Always true: failures are in VizProductStructure::GetErrorMessages.
+    bool ImportAndBuildPS();
+
+    void SetImportPMI(bool const& importPMI) { m_importPMI = importPMI; }
+    void SetImportVisu(bool const& importVisu) { m_importVisu = importVisu; }
+    /// Not owned; null means that no BREP can be imported.
+    void SetModelerServices(VizModelerServices* services) { m_modelerServices = services; }
+    void SetProgressCallback(ProgressCallback callback) { m_progressCallback = callback; }
+
+    /// Seconds spent in the modeler's imports.
+    double GetTotalImportBrepTime() const { return m_totalImportBrepTime; }
+    /// Seconds spent importing visualisation data.
+    double GetTotalImportGeomTime() const { return m_totalImportGeomTime; }
+    /// Seconds spent importing the product-level PMI data.
+    double GetTotalImportSemanticPMITime() const { return m_totalImportSemanticPMITime; }
+    int GetNumberOfProcessorsUsed() const { return m_numberOfProcessorsUsed; }
+
+private:
+    static void loadReferenceStructure(VizProductStructure& structure,
+                                       TarvexInputPSReference const& reference,
+                                       VizPSEntry* parent);
+    static bool defineMissingFile(VizProductStructure& structure, int const& id,
+                                  TarvexInputPSReference const& reference);
+    static void getDocumentInfo(TarvexDocument& document, VizProductStructure& structure);
+    static void setConfigurationAndUnits(TarvexInputProductStructure const& input,
+                                         VizProductStructure& structure);
+
+    void resetTimers();
+    void loadProductStructureInstanceData();
+    void loadProductStructureGraphicalData();
+    void loadProductStructureAssemblyData();
+
+    VizProductStructure& m_productStructure;            ///< not owned
+    TarvexInputProductStructure const& m_inputProductStructure; ///< not owned
+    VizModelerServices* m_modelerServices = nullptr;   ///< not owned
+    TarvexPolicy* m_policy;                            ///< not owned; may be null
+    ProgressCallback m_progressCallback = nullptr;
+    bool m_importVisu = false;
+    bool m_importPMI = false;
+    double m_totalImportBrepTime = 0.0;
+    double m_totalImportSemanticPMITime = 0.0;
+    double m_totalImportGeomTime = 0.0;
+    int m_numberOfProcessorsUsed = 1;
+    std::map<WString, VizElement*> m_visuIdMap; ///< elements not owned
+};
+
+} // namespace VizBridgeTarvex

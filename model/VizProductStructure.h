@@ -1,0 +1,166 @@
+#pragma once
+
+#include "model/SemanticPMIMaps.h"
+#include "model/VizDocumentInfo.h"
+#include "model/VizTypes.h"
+
+#include <map>
+#include <memory>
+#include <vector>
+
+namespace VizBridgeTarvex {
+
+class VizBuilder;
+class VizOwnedObjects;
+class VizPartContainer;
+class VizPSEntry;
+
+/// The result of an import and the input of a render: the document strings, the tree of
+/// instances, per reference the containers of what was loaded, and every failure.
+///
+/// Created by VizBuilder::MakeVizProductStructure, which hands it to the host; the host
+/// deletes it after every renderer on it. It owns all its entries and containers.
+///
+/// Copies: a copy holds the same entries and containers. Copies share their ownership,
+/// so every copy may be destroyed in any order and the objects go with the last of them.
+class VizProductStructure : public VizDocumentInfo {
+public:
+    VizProductStructure(VizProductStructure const&);
+    VizProductStructure& operator=(VizProductStructure const&);
+    ~VizProductStructure();
+
+    // Document strings.
+    WString GetProductName() const { return productName; }
+    WString GetFormatType() const { return formatType; }
+    WString GetAuthor() const { return author; }
+    WString GetOrganization() const { return organization; }
+    WString GetVersion() const { return version; }
+    WString GetDocumentUnits() const { return documentUnits; }
+    WString GetSourceSystem() const { return sourceSystem; }
+    WString GetComment() const { return comment; }
+    WString GetFileName() const { return fileName; }
+    /// The product name of an imported structure; empty for one made from host data.
+    WString GetConfigurationName() const { return m_configurationName; }
+    /// The length unit of the input product structure, as text.
+    WString GetUnits() const { return m_units; }
+
+    // Tree.
+    std::vector<VizPSEntry*> const& GetChildren() const { return m_rootEntries; }
+    /// The first entry built for reference `id`, or null.
+    VizPSEntry* GetSubAssembly(int const& id) const;
+
+    // Containers. A lookup never adds a key; an absent key gives null.
+    std::map<int, VizPartContainer*> const& GetAllVizPartContainers() const {
+        return m_vizPartContainers;
+    }
+    std::map<int, VizContainer*> const& GetAllVizContainers() const { return m_vizContainers; }
+    std::map<int, VizPMIContainer*> const& GetAllVizPMIContainers() const {
+        return m_vizPMIContainers;
+    }
+    VizPartContainer* GetVizPartContainer(int const& id) const;
+    VizContainer* GetVizContainer(int const& id) const;
+    VizPMIContainer* GetVizPMIContainer(int const& id) const;
+    int const GetNumberOfVizPartContainers() const {
+        return static_cast<int>(m_vizPartContainers.size());
+    }
+    int const GetNumberOfVizContainers() const { return static_cast<int>(m_vizContainers.size()); }
+    int const GetNumberOfVizPMIContainers() const {
+        return static_cast<int>(m_vizPMIContainers.size());
+    }
+    int GetContainerCount() const { return m_containerCount; }
+
+    // State.
+    bool IsLoaded(int const& id) const { return m_subAssemblies.count(id) != 0; }
+    bool IsVizLoaded(int const& id) const;
+    bool IsBREPLoaded(int const& id) const { return m_vizPartContainers.count(id) != 0; }
+    bool IsSemanticInfoLoaded(int const& id) const;
+    /// Nothing in the system sets these two: they stay false.
+    bool IsAllBREPLoaded() const { return m_allBREPLoaded; }
+    bool IsAllVizLoaded() const { return m_allVizLoaded; }
+    bool IsTesselatingText() const { return m_tesselatingText; }
+    /// True and the storage name if reference `id` was found missing; else `name` stays.
+    bool IsMissingFile(int const& id, WString& name) const;
+
+    /// Whether PMI texts are tessellated into strokes and glyphs. Read when text elements
+    /// are loaded: set it before VizBuilder::ImportAndBuildPS.
+    void SetTesselatingText(bool tesselate) { m_tesselatingText = tesselate; }
+
+    // Failures.
+    std::vector<WString> GetMissingFiles() const { return m_missingFiles; }
+    /// Import errors by reference id, then visualisation errors by reference id, then
+    /// "Missing File " and each missing file name.
+    std::vector<WString> GetErrorMessages() const;
+
+    // Semantic PMI. The first container in reference id order that knows `key` answers.
+    /// The record stays the container's.
+    bool GetSemanticPMI(WString const& key, SemanticPMI*& out) const;
+    /// Empty when no container knows `key`.
+    WString GetSemanticPMIAsString(WString const& key) const;
+
+    /// Takes the first entry holding `container` out of the map and gives ownership back
+    /// to the caller. Other keys or copies that still name it then name the caller's object.
+    /// A pointer that is not in the map changes nothing.
+    void RemoveVizPartContainer(VizPartContainer* container);
+    void RemoveVizPMIContainer(VizPMIContainer* container);
+
+    /// "Product: " and the product name, then the tree, one line per entry.
+    WString ToString() const;
+
+private:
+    friend class VizBuilder;
+    explicit VizProductStructure(char16_t const* productName);
+
+    void SetContainerCount(int count) { m_containerCount = count; }
+    /// A null entry is ignored. Sets the entry's structure to this one.
+    void AddRootEntry(VizPSEntry* entry);
+    /// A null entry is ignored. Sets the entry's structure and takes ownership; never
+    /// replaces an entry under the same id. Each entry may be added once.
+    void AddSubAssembly(int const& id, VizPSEntry* entry);
+    /// Take ownership and set the value under `id`. A null container is ignored (the
+    /// reference then counts as not loaded). A different container that stood under `id`
+    /// stays owned by the structure until it is destroyed, so pointers to it and its
+    /// elements that were handed out stay valid.
+    void AddVizPartContainer(int const& id, VizPartContainer* container);
+    void AddVizContainer(int const& id, VizContainer* container);
+    void AddVizPMIContainer(int const& id, VizPMIContainer* container);
+    /// Hands every non-null record of `records`, in key order, to the PMI container of
+    /// `id`. Records that no container takes are freed. On return `records` is empty; the
+    /// map itself stays the caller's. A null map does nothing.
+    void AddSemanticPMI(int const& id, SemanticPMIByKey* records);
+
+    void addMissingFile(WString const& name) { m_missingFiles.push_back(name); }
+    void addMissingReference(int const& id, WString const& storageName) {
+        m_missingReferences[id] = storageName;
+    }
+    /// Key 0 collects product-level failures one after the other; every other key keeps
+    /// the last text.
+    void appendImportError(int const& id, WString const& text) { m_importErrors[id] += text; }
+    void setImportError(int const& id, WString const& text) { m_importErrors[id] = text; }
+    void setVisuError(int const& id, WString const& text) { m_visuErrors[id] = text; }
+    void assignDocumentInfo(VizDocumentInfo const& info) {
+        static_cast<VizDocumentInfo&>(*this) = info;
+    }
+    void setConfigurationName(WString const& name) { m_configurationName = name; }
+    void setUnits(WString const& units) { m_units = units; }
+    std::vector<WString> const& missingFiles() const { return m_missingFiles; }
+
+    WString m_configurationName;
+    WString m_units;
+    int m_containerCount = 0;
+    bool m_allBREPLoaded = false;
+    bool m_allVizLoaded = false;
+    bool m_tesselatingText = false;
+    std::vector<VizPSEntry*> m_rootEntries;             ///< not owned: m_subAssemblies' entries
+    std::multimap<int, VizPSEntry*> m_subAssemblies;    ///< owned, through m_owned
+    std::map<int, VizPartContainer*> m_vizPartContainers; ///< owned, through m_owned
+    std::map<int, VizContainer*> m_vizContainers;         ///< owned, through m_owned
+    std::map<int, VizPMIContainer*> m_vizPMIContainers;   ///< owned, through m_owned
+    std::vector<WString> m_missingFiles;
+    std::map<int, WString> m_missingReferences;
+    std::map<int, WString> m_importErrors;
+    std::map<int, WString> m_visuErrors;
+    /// Everything the structure owns, shared by its copies and freed with the last one.
+    std::shared_ptr<VizOwnedObjects> m_owned;
+};
+
+} // namespace VizBridgeTarvex
