@@ -77,8 +77,7 @@ public:
 
 private:
     static void loadReferenceStructure(VizProductStructure& structure,
-                                       TarvexInputPSReference const& reference,
-                                       VizPSEntry* parent);
+                                       TarvexInputPSReference const& reference, VizPSEntry* parent);
     static bool defineMissingFile(VizProductStructure& structure, int const& id,
                                   TarvexInputPSReference const& reference);
     static void getDocumentInfo(TarvexDocument& document, VizProductStructure& structure);
@@ -90,10 +89,10 @@ private:
     void loadProductStructureGraphicalData();
     void loadProductStructureAssemblyData();
 
-    VizProductStructure& m_productStructure;            ///< not owned
+    VizProductStructure& m_productStructure;                    ///< not owned
     TarvexInputProductStructure const& m_inputProductStructure; ///< not owned
-    VizModelerServices* m_modelerServices = nullptr;   ///< not owned
-    TarvexPolicy* m_policy;                            ///< not owned; may be null
+    VizModelerServices* m_modelerServices = nullptr;            ///< not owned
+    TarvexPolicy* m_policy;                                     ///< not owned; may be null
     ProgressCallback m_progressCallback = nullptr;
     bool m_importVisu = false;
     bool m_importPMI = false;

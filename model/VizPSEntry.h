@@ -65,7 +65,7 @@ private:
     WString m_referenceName;
     WString m_instanceName;
     bool m_isPart;
-    std::vector<VizPSEntry*> m_children;           ///< not owned
+    std::vector<VizPSEntry*> m_children;               ///< not owned
     VizProductStructure* m_productStructure = nullptr; ///< not owned: the owner of this entry
     bool m_hasAlpha = false;
     bool m_hidden = false;

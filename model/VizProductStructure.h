@@ -23,7 +23,7 @@ class VizPSEntry;
 ///
 /// Copies: a copy holds the same entries and containers. Copies share their ownership,
 /// so every copy may be destroyed in any order and the objects go with the last of them.
-class VizProductStructure : public VizDocumentInfo {
+class VizProductStructure : private VizDocumentInfo {
 public:
     VizProductStructure(VizProductStructure const&);
     VizProductStructure& operator=(VizProductStructure const&);
@@ -60,13 +60,11 @@ public:
     VizPartContainer* GetVizPartContainer(int const& id) const;
     VizContainer* GetVizContainer(int const& id) const;
     VizPMIContainer* GetVizPMIContainer(int const& id) const;
-    int const GetNumberOfVizPartContainers() const {
+    int GetNumberOfVizPartContainers() const {
         return static_cast<int>(m_vizPartContainers.size());
     }
-    int const GetNumberOfVizContainers() const { return static_cast<int>(m_vizContainers.size()); }
-    int const GetNumberOfVizPMIContainers() const {
-        return static_cast<int>(m_vizPMIContainers.size());
-    }
+    int GetNumberOfVizContainers() const { return static_cast<int>(m_vizContainers.size()); }
+    int GetNumberOfVizPMIContainers() const { return static_cast<int>(m_vizPMIContainers.size()); }
     int GetContainerCount() const { return m_containerCount; }
 
     // State.
@@ -108,6 +106,7 @@ public:
 
 private:
     friend class VizBuilder;
+    friend class VizProductStructureTestPeer; // lets the tests fill a structure directly
     explicit VizProductStructure(char16_t const* productName);
 
     void SetContainerCount(int count) { m_containerCount = count; }
@@ -150,8 +149,8 @@ private:
     bool m_allBREPLoaded = false;
     bool m_allVizLoaded = false;
     bool m_tesselatingText = false;
-    std::vector<VizPSEntry*> m_rootEntries;             ///< not owned: m_subAssemblies' entries
-    std::multimap<int, VizPSEntry*> m_subAssemblies;    ///< owned, through m_owned
+    std::vector<VizPSEntry*> m_rootEntries;               ///< not owned: m_subAssemblies' entries
+    std::multimap<int, VizPSEntry*> m_subAssemblies;      ///< owned, through m_owned
     std::map<int, VizPartContainer*> m_vizPartContainers; ///< owned, through m_owned
     std::map<int, VizContainer*> m_vizContainers;         ///< owned, through m_owned
     std::map<int, VizPMIContainer*> m_vizPMIContainers;   ///< owned, through m_owned
