@@ -10,11 +10,14 @@
 class TarvexFaultPlan {
 public:
     void Add(TarvexFault fault);
+    /// Removes every planned fault and sets the fired count back to 0.
     void Clear();
-    /// How many times a planned fault has fired so far.
+    /// How many times a planned fault has fired since the plan was made or cleared.
     int GetFiredCount() const;
 
-    /// Throws if a planned fault matches `operation` on `subject`; otherwise returns.
+    /// Throws if a planned fault matches `operation` on `subject`; otherwise returns. Every
+    /// matching fault counts the call against its skip; when several are due, the one added
+    /// first throws.
     void Check(char const* operation, unsigned int subject) const;
 
 private:

@@ -18,6 +18,8 @@ class TarvexModelData;
 /// through which a host or test fills it. The value objects handed out share the model's
 /// data and keep it alive; authoring after they were handed out is seen by them.
 /// Not thread-safe while authoring; reading through value objects is.
+/// A moved-from model hands out empty value objects, and its next authoring call starts a
+/// new, empty model.
 class TarvexModel {
 public:
     TarvexModel();
@@ -31,7 +33,8 @@ public:
     void SetProductName(std::optional<VizPort::WString> name);
     void SetUnits(TarvexLengthUnitType unit);
     /// Overrides GetUniqueReferencesCount, which otherwise counts the distinct references
-    /// reachable from the root instances.
+    /// reachable from the root instances. A reference that is placed but was never added is
+    /// not counted: it reads back as an empty sub-assembly.
     void SetUniqueReferencesCount(std::optional<int> count);
 
     /// Adds a reference and returns its record, which stays valid as long as the model.
@@ -46,6 +49,9 @@ public:
 
     /// Places `referenceId` at the top of the product / below `parentId`. The reference
     /// need not exist yet; an instance of an unknown reference gives an empty reference.
+    /// Instances get the authoring ids 1, 2, 3, ... in the order they are added, and the
+    /// record stays valid as long as the model. AddInstance throws std::invalid_argument,
+    /// and adds nothing, when `parentId` names no reference added before.
     TarvexAuthoredInstance& AddRootInstance(unsigned int referenceId,
                                             std::optional<VizPort::WString> name);
     TarvexAuthoredInstance& AddInstance(unsigned int parentId, unsigned int referenceId,
@@ -62,5 +68,8 @@ public:
     TarvexDocument GetDocument() const;
 
 private:
-    std::shared_ptr<TarvexModelData> m_data;
+    /// The data to author into, made anew after a move.
+    TarvexModelData& data();
+
+    std::shared_ptr<TarvexModelData> m_data; ///< shared with the value objects handed out
 };

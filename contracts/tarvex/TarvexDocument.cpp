@@ -1,0 +1,11 @@
+#include "contracts/tarvex/TarvexDocument.h"
+
+#include "contracts/tarvex/TarvexModelData.h"
+
+TarvexDocumentInformation TarvexDocument::GetInformation() {
+    if (!m_data) {
+        return TarvexDocumentInformation();
+    }
+    m_data->faults.Check("TarvexDocument::GetInformation", 0);
+    return TarvexDocumentInformation(m_data);
+}

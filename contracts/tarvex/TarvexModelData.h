@@ -1,0 +1,42 @@
+#pragma once
+
+#include "contracts/platform/WString.h"
+#include "contracts/tarvex/TarvexAuthoredDocument.h"
+#include "contracts/tarvex/TarvexAuthoredInstance.h"
+#include "contracts/tarvex/TarvexAuthoredReference.h"
+#include "contracts/tarvex/TarvexFaultPlan.h"
+#include "contracts/tarvex/TarvexLengthUnitType.h"
+
+#include <deque>
+#include <map>
+#include <optional>
+#include <vector>
+
+/// The data of one TarvexModel, shared by the model and every value object it handed out;
+/// the last of them to go frees it. Internal to the library: hosts and tests author through
+/// TarvexModel and read through the value objects. Owns everything it holds.
+class TarvexModelData {
+public:
+    std::optional<VizPort::WString> productName;
+    TarvexLengthUnitType unit = TarvexLengthUnit_Unknown;
+    /// Replaces the computed unique-reference count when set.
+    std::optional<int> uniqueReferencesCount;
+    /// By unique id. Map nodes never move, so the records handed out by the authoring API
+    /// stay valid while references are added.
+    std::map<unsigned int, TarvexAuthoredReference> references;
+    /// Instance with authoring id n at position n - 1. A deque keeps the records handed out
+    /// by the authoring API valid while instances are appended.
+    std::deque<TarvexAuthoredInstance> instances;
+    /// Authoring ids of the root instances, in the order they were added.
+    std::vector<unsigned int> rootInstances;
+    TarvexAuthoredDocument document;
+    std::vector<std::optional<VizPort::WString>> missingFiles;
+    TarvexFaultPlan faults;
+
+    /// Null when the model does not know `uniqueId`.
+    TarvexAuthoredReference const* FindReference(unsigned int uniqueId) const;
+    /// Null when the model does not know `instanceId`.
+    TarvexAuthoredInstance const* FindInstance(unsigned int instanceId) const;
+    /// The defined references reachable from the root instances, each counted once.
+    int CountReachableReferences() const;
+};

@@ -1,0 +1,11 @@
+#include "contracts/tarvex/TarvexPSImportResult.h"
+
+#include "contracts/tarvex/TarvexModelData.h"
+
+TarvexInputPSMissingFileIter TarvexPSImportResult::GetMissingFileIterator() const {
+    if (!m_data) {
+        return TarvexInputPSMissingFileIter();
+    }
+    m_data->faults.Check("TarvexPSImportResult::GetMissingFileIterator", 0);
+    return TarvexInputPSMissingFileIter(m_data);
+}
