@@ -1,6 +1,7 @@
 #pragma once
 
 #include "contracts/platform/WString.h"
+#include "contracts/tarvex/TarvexAuthoredPartGeometry.h"
 
 #include <optional>
 #include <vector>
@@ -15,4 +16,6 @@ struct TarvexAuthoredReference {
     /// Authoring ids of the instances below this reference, in order. Filled by
     /// TarvexModel::AddInstance.
     std::vector<unsigned int> instances;
+    /// The part document's geometry; read only for parts.
+    TarvexAuthoredPartGeometry geometry;
 };

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "contracts/tarvex/TarvexInputPSInstance.h"
+#include "contracts/tarvex/TarvexInputPSReference.h"
 #include "contracts/tarvex/TarvexLengthUnitType.h"
 #include "contracts/tarvex/TarvexWString.h"
 
@@ -22,6 +23,9 @@ public:
     /// The root instance at `index`; an empty instance when out of range.
     TarvexInputPSInstance GetRootInstance(int index) const;
     TarvexLengthUnitType GetUnits() const;
+    /// The reference with this unique id, or the one TarvexModel::SetSpoolerIdAlias names
+    /// for it; an empty reference for an unknown id.
+    TarvexInputPSReference GetReferenceFromId(int id) const;
 
 private:
     std::shared_ptr<TarvexModelData const> m_data;

@@ -3,11 +3,14 @@
 #include "contracts/tarvex/TarvexAuthoredDocument.h"
 #include "contracts/tarvex/TarvexAuthoredInstance.h"
 #include "contracts/tarvex/TarvexAuthoredReference.h"
+#include "contracts/tarvex/TarvexEntity.h"
 #include "contracts/tarvex/TarvexFaultPlan.h"
 #include "contracts/tarvex/TarvexLengthUnitType.h"
+#include "contracts/tarvex/TarvexPMIAnnotation.h"
 
 #include <memory>
 #include <optional>
+#include <vector>
 
 class TarvexDocument;
 class TarvexInputProductStructure;
@@ -61,6 +64,22 @@ public:
     void AddMissingFile(std::optional<VizPort::WString> name);
 
     TarvexFaultPlan& Faults();
+
+    // Multi-process conversion.
+    /// The spooler delivers the part references in this order (each still only once its
+    /// conversion is done); parts not listed follow in the order their conversions finish.
+    void SetSpoolerDeliveryOrder(std::vector<unsigned int> order);
+    /// The spooler delivers `deliveredId` in place of reference `referenceId`, and
+    /// GetReferenceFromId(deliveredId) gives reference `referenceId`: a delivery whose id
+    /// does not match its reference.
+    void SetSpoolerIdAlias(unsigned int referenceId, unsigned int deliveredId);
+
+    // Entities.
+    /// An entity `entityId` of a part, reached through `instancePath` (instance authoring
+    /// ids from the top; empty: in the part itself).
+    TarvexEntity MakeEntity(std::vector<unsigned int> instancePath, unsigned int entityId) const;
+    /// An annotation linked to `linkedElements`.
+    TarvexPMIAnnotation MakeAnnotation(std::vector<TarvexEntity> linkedElements) const;
 
     // Value objects onto this model.
     TarvexPSImportResult GetImportResult() const;

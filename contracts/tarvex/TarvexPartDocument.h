@@ -1,5 +1,7 @@
 #pragma once
 
+#include "contracts/tarvex/TarvexConvertedPart.h"
+#include "contracts/tarvex/TarvexPMIData.h"
 #include "contracts/tarvex/TarvexWString.h"
 
 #include <memory>
@@ -17,6 +19,13 @@ public:
     bool IsValid() const { return m_data != nullptr; }
     unsigned int GetReferenceId() const { return m_referenceId; }
     TarvexWString GetName() const;
+
+    /// The part in modeler-ready form. Converted on first use, on the calling thread, unless
+    /// the multi-process spooler converted it already; every later call gives the same
+    /// object. Null for an invalid document or a conversion that fails.
+    std::shared_ptr<TarvexConvertedPart const> GetConvertedPart() const;
+    /// The part's PMI.
+    TarvexPMIData GetPMIData() const;
 
 private:
     std::shared_ptr<TarvexModelData const> m_data;
