@@ -18,7 +18,9 @@ public:
     }
     void AddValue(std::uint32_t tag) { m_tags.push_back(tag); }
     /// Cuts or pads (with 0) the path to `length` tags.
-    void SetLength(int length) { m_tags.resize(length < 0 ? 0u : static_cast<std::size_t>(length)); }
+    void SetLength(int length) {
+        m_tags.resize(length < 0 ? 0u : static_cast<std::size_t>(length));
+    }
     bool IsEmpty() const { return m_tags.empty(); }
     void Clear() { m_tags.clear(); }
 

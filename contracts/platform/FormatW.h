@@ -20,6 +20,7 @@ using FormatArg = std::variant<char16_t const*, int, unsigned long, double>;
 /// terminator of a fixed buffer); it never overruns. A conversion whose argument is
 /// missing or of another kind prints nothing, and an unknown conversion is copied as it
 /// stands: formatting never throws on a bad format.
-WString FormatW(std::size_t bufferSize, char16_t const* format, std::initializer_list<FormatArg> args);
+WString FormatW(std::size_t bufferSize, char16_t const* format,
+                std::initializer_list<FormatArg> args);
 
 } // namespace VizPort

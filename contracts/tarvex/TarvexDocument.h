@@ -10,7 +10,8 @@ class TarvexModelData;
 class TarvexDocument {
 public:
     TarvexDocument() = default;
-    explicit TarvexDocument(std::shared_ptr<TarvexModelData const> data) : m_data(std::move(data)) {}
+    explicit TarvexDocument(std::shared_ptr<TarvexModelData const> data)
+        : m_data(std::move(data)) {}
 
     TarvexDocumentInformation GetInformation();
 

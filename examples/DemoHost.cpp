@@ -1,0 +1,140 @@
+// vizbridge_demo: a host that imports the bundled sample assembly and prints what VizBridge
+// made of it. Each step of the road is one function below.
+
+#include "examples/SampleAssembly.h"
+
+#include "contracts/platform/DebugOutput.h"
+#include "contracts/platform/WString.h"
+#include "contracts/tarvex/TarvexDocument.h"
+#include "contracts/tarvex/TarvexInputProductStructure.h"
+#include "contracts/tarvex/TarvexPSImportResult.h"
+#include "import/VizBuilder.h"
+#include "model/VizProductStructure.h"
+
+#include <exception>
+#include <iostream>
+#include <memory>
+
+namespace {
+
+using VizBridgeTarvex::VizBuilder;
+using VizBridgeTarvex::VizProductStructure;
+using VizPort::Narrow;
+
+/// The import's progress callback: called synchronously on the importing thread, with a
+/// null text at the first and the last call.
+void PrintProgress(int const& current, int const& total, char16_t const* text) {
+    std::cout << "  progress " << current << '/' << total;
+    if (text != nullptr)
+        std::cout << ": " << Narrow(text);
+    std::cout << '\n';
+}
+
+/// VizBridge's debug output is silent until a host gives it a sink.
+void PrintDebugText(char16_t const* text) {
+    std::cerr << "  [debug] " << Narrow(text) << '\n';
+}
+
+/// Step 1: the structure, its document strings, missing files and instance tree.
+/// MakeVizProductStructure hands the structure over; from here on the host owns it.
+std::unique_ptr<VizProductStructure> MakeStructure(TarvexModel const& model,
+                                                   TarvexInputProductStructure const& input) {
+    TarvexPSImportResult const result = model.GetImportResult();
+    TarvexDocument document = model.GetDocument();
+    VizProductStructure* structure = nullptr;
+    try {
+        VizBuilder::MakeVizProductStructure(result, input, document, structure);
+    } catch (...) {
+        // Only with KolbaVizCore's throw switch on: what was built is already the host's.
+        delete structure;
+        throw;
+    }
+    return std::unique_ptr<VizProductStructure>(structure);
+}
+
+struct ImportTimes {
+    double brep = 0.0;
+    double geometry = 0.0;
+    double semanticPMI = 0.0;
+    int processors = 1;
+};
+
+/// Step 2: a builder on the structure imports the data behind the tree. The builder only
+/// points at the structure and the input, and may go as soon as the import has returned.
+ImportTimes ImportData(VizProductStructure& structure, TarvexInputProductStructure const& input) {
+    VizBuilder builder(structure, input, nullptr); // no import policy
+    builder.SetProgressCallback(&PrintProgress);
+    builder.ImportAndBuildPS(); // always true: failures go to GetErrorMessages
+    return {builder.GetTotalImportBrepTime(), builder.GetTotalImportGeomTime(),
+            builder.GetTotalImportSemanticPMITime(), builder.GetNumberOfProcessorsUsed()};
+}
+
+void PrintTree(VizProductStructure const& structure) {
+    std::cout << Narrow(structure.ToString()) << '\n';
+}
+
+void PrintDocument(VizProductStructure const& structure) {
+    struct Field {
+        char const* label;
+        VizPort::WString (VizProductStructure::*get)() const;
+    };
+    static constexpr Field fields[] = {
+        {"Product name", &VizProductStructure::GetProductName},
+        {"Format type", &VizProductStructure::GetFormatType},
+        {"Author", &VizProductStructure::GetAuthor},
+        {"Organization", &VizProductStructure::GetOrganization},
+        {"Version", &VizProductStructure::GetVersion},
+        {"Document units", &VizProductStructure::GetDocumentUnits},
+        {"Source system", &VizProductStructure::GetSourceSystem},
+        {"Comment", &VizProductStructure::GetComment},
+        {"File name", &VizProductStructure::GetFileName},
+        {"Configuration", &VizProductStructure::GetConfigurationName},
+        {"Units", &VizProductStructure::GetUnits},
+    };
+    for (Field const& field : fields)
+        std::cout << "  " << field.label << ": " << Narrow((structure.*field.get)()) << '\n';
+}
+
+/// Step 3: failures never show in a result; the structure keeps them as texts.
+void PrintFailures(VizProductStructure const& structure) {
+    std::cout << "Missing files:\n";
+    for (VizPort::WString const& file : structure.GetMissingFiles())
+        std::cout << "  " << Narrow(file) << '\n';
+    std::cout << "Error messages:\n";
+    for (VizPort::WString const& message : structure.GetErrorMessages())
+        std::cout << "  " << Narrow(message) << '\n';
+}
+
+void PrintTimes(ImportTimes const& times) {
+    std::cout << "Import times (s): BREP " << times.brep << ", geometry " << times.geometry
+              << ", semantic PMI " << times.semanticPMI << '\n'
+              << "Processors used: " << times.processors << '\n';
+}
+
+} // namespace
+
+int main() {
+    try {
+        VizPort::ScopedDebugSink const debugToStderr(&PrintDebugText);
+        VizBridgeExamples::SampleAssembly const sample;
+        TarvexInputProductStructure const input = sample.GetModel().GetInputProductStructure();
+
+        std::cout << "Building the product structure\n";
+        std::unique_ptr<VizProductStructure> structure = MakeStructure(sample.GetModel(), input);
+        std::cout << "Importing\n";
+        ImportTimes const times = ImportData(*structure, input);
+
+        PrintTree(*structure);
+        std::cout << "Document:\n";
+        PrintDocument(*structure);
+        PrintFailures(*structure);
+        PrintTimes(times);
+
+        // The structure goes last: after the builder and every renderer made on it.
+        structure.reset();
+        return 0;
+    } catch (std::exception const& e) {
+        std::cerr << "vizbridge_demo: " << e.what() << '\n';
+        return 1;
+    }
+}
