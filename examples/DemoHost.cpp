@@ -7,7 +7,9 @@
 #include "contracts/platform/WString.h"
 #include "contracts/tarvex/TarvexDocument.h"
 #include "contracts/tarvex/TarvexInputProductStructure.h"
+#include "contracts/tarvex/TarvexMultiProcess.h"
 #include "contracts/tarvex/TarvexPSImportResult.h"
+#include "examples/ReferenceModeler/ReferenceModelerServices.h"
 #include "import/VizBuilder.h"
 #include "model/VizProductStructure.h"
 
@@ -59,10 +61,13 @@ struct ImportTimes {
     int processors = 1;
 };
 
-/// Step 2: a builder on the structure imports the data behind the tree. The builder only
-/// points at the structure and the input, and may go as soon as the import has returned.
-ImportTimes ImportData(VizProductStructure& structure, TarvexInputProductStructure const& input) {
+/// Step 2: a builder on the structure imports the data behind the tree, each part through
+/// the host's modeler. The builder only points at the structure, the input and the modeler,
+/// and may go as soon as the import has returned; the host keeps the modeler.
+ImportTimes ImportData(VizProductStructure& structure, TarvexInputProductStructure const& input,
+                       VizBridgeTarvex::VizModelerServices& modeler) {
     VizBuilder builder(structure, input, nullptr); // no import policy
+    builder.SetModelerServices(&modeler);
     builder.SetProgressCallback(&PrintProgress);
     builder.ImportAndBuildPS(); // always true: failures go to GetErrorMessages
     return {builder.GetTotalImportBrepTime(), builder.GetTotalImportGeomTime(),
@@ -113,25 +118,37 @@ void PrintTimes(ImportTimes const& times) {
 
 } // namespace
 
+/// The whole road once, with the import spread over `processors` processes (0: all the
+/// machine has; 1: the caller's process alone).
+void RunRoad(VizBridgeExamples::SampleAssembly const& sample, int processors) {
+    TarvexMultiProcess::SetNumberOfProcessorsToUse(processors);
+    TarvexInputProductStructure const input = sample.GetModel().GetInputProductStructure();
+    VizReferenceModeler::ReferenceModelerServices modeler;
+
+    std::cout << "Building the product structure\n";
+    std::unique_ptr<VizProductStructure> structure = MakeStructure(sample.GetModel(), input);
+    std::cout << "Importing\n";
+    ImportTimes const times = ImportData(*structure, input, modeler);
+
+    PrintTree(*structure);
+    std::cout << "Document:\n";
+    PrintDocument(*structure);
+    std::cout << "BREP containers: " << structure->GetNumberOfVizPartContainers() << '\n';
+    PrintFailures(*structure);
+    PrintTimes(times);
+
+    // The structure goes last: after the builder and every renderer made on it.
+    structure.reset();
+}
+
 int main() {
     try {
         VizPort::ScopedDebugSink const debugToStderr(&PrintDebugText);
         VizBridgeExamples::SampleAssembly const sample;
-        TarvexInputProductStructure const input = sample.GetModel().GetInputProductStructure();
-
-        std::cout << "Building the product structure\n";
-        std::unique_ptr<VizProductStructure> structure = MakeStructure(sample.GetModel(), input);
-        std::cout << "Importing\n";
-        ImportTimes const times = ImportData(*structure, input);
-
-        PrintTree(*structure);
-        std::cout << "Document:\n";
-        PrintDocument(*structure);
-        PrintFailures(*structure);
-        PrintTimes(times);
-
-        // The structure goes last: after the builder and every renderer made on it.
-        structure.reset();
+        std::cout << "=== Import in the caller's process\n";
+        RunRoad(sample, 1);
+        std::cout << "\n=== Import through the multi-process spooler\n";
+        RunRoad(sample, 0);
         return 0;
     } catch (std::exception const& e) {
         std::cerr << "vizbridge_demo: " << e.what() << '\n';

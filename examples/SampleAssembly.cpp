@@ -25,6 +25,36 @@ TarvexPlacement QuarterTurnAboutZ(double x, double y, double z) {
     return placement;
 }
 
+/// A box part of `sx` by `sy` by `sz` millimetres from the origin: six faces of two
+/// triangles (entity ids `firstId` to `firstId + 5`) and its twelve edges (the next ids).
+TarvexAuthoredPartGeometry Cuboid(float sx, float sy, float sz, unsigned int firstId) {
+    float const corners[8][3] = {{0, 0, 0},  {sx, 0, 0},  {sx, sy, 0},  {0, sy, 0},
+                                 {0, 0, sz}, {sx, 0, sz}, {sx, sy, sz}, {0, sy, sz}};
+    // Each face by its four corners, counter-clockwise seen from outside.
+    unsigned int const faces[6][4] = {{0, 3, 2, 1}, {4, 5, 6, 7}, {0, 1, 5, 4},
+                                      {2, 3, 7, 6}, {1, 2, 6, 5}, {0, 4, 7, 3}};
+    unsigned int const edges[12][2] = {{0, 1}, {1, 2}, {2, 3}, {3, 0}, {4, 5}, {5, 6},
+                                       {6, 7}, {7, 4}, {0, 4}, {1, 5}, {2, 6}, {3, 7}};
+    TarvexAuthoredPartGeometry geometry;
+    unsigned int id = firstId;
+    for (auto const& face : faces) {
+        TarvexAuthoredFace authored;
+        authored.entityId = id++;
+        for (unsigned int corner : face)
+            authored.vertices.insert(authored.vertices.end(), corners[corner], corners[corner] + 3);
+        authored.triangles = {0, 1, 2, 0, 2, 3};
+        geometry.faces.push_back(std::move(authored));
+    }
+    for (auto const& edge : edges) {
+        TarvexAuthoredEdge authored;
+        authored.entityId = id++;
+        for (unsigned int corner : edge)
+            authored.points.insert(authored.points.end(), corners[corner], corners[corner] + 3);
+        geometry.edges.push_back(std::move(authored));
+    }
+    return geometry;
+}
+
 } // namespace
 
 SampleAssembly::SampleAssembly() {
@@ -52,9 +82,9 @@ void SampleAssembly::addDocument() {
 
 void SampleAssembly::addReferences() {
     m_model.AddAssembly(kBracketAssemblyId, u"BracketAssembly", u"BracketAssembly.asm");
-    m_model.AddPart(kBracketId, u"Bracket", u"Bracket.prt");
-    m_model.AddPart(kBoltId, u"Bolt", u"Bolt.prt");
-    m_model.AddPart(kCoverId, u"Cover", u"Cover.prt");
+    m_model.AddPart(kBracketId, u"Bracket", u"Bracket.prt").geometry = Cuboid(60, 20, 10, 100);
+    m_model.AddPart(kBoltId, u"Bolt", u"Bolt.prt").geometry = Cuboid(6, 6, 30, 200);
+    m_model.AddPart(kCoverId, u"Cover", u"Cover.prt").geometry = Cuboid(80, 40, 2, 300);
 }
 
 void SampleAssembly::addInstances() {

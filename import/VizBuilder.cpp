@@ -14,6 +14,7 @@
 #include "model/VizPartContainer.h"
 #include "model/VizProductStructure.h"
 
+#include <algorithm>
 #include <memory>
 #include <stdexcept>
 
@@ -112,8 +113,10 @@ void VizBuilder::MakeVizProductStructure(TarvexPSImportResult const& result,
             structure.appendImportError(id, text);
             continue;
         }
-        if (descend)
-            loadReferenceStructure(structure, reference, entry);
+        if (descend) {
+            std::vector<int> ancestors{id};
+            loadReferenceStructure(structure, reference, entry, ancestors);
+        }
     }
 
     setConfigurationAndUnits(input, structure);
@@ -173,8 +176,8 @@ void VizBuilder::MakeVizProductStructure(VizDocumentInfo const& info, VizPartCon
 }
 
 void VizBuilder::loadReferenceStructure(VizProductStructure& structure,
-                                        TarvexInputPSReference const& reference,
-                                        VizPSEntry* parent) {
+                                        TarvexInputPSReference const& reference, VizPSEntry* parent,
+                                        std::vector<int>& ancestors) {
     if (!parent)
         return;
     int const count = reference.GetInstancesCount();
@@ -189,14 +192,22 @@ void VizBuilder::loadReferenceStructure(VizProductStructure& structure,
             bool const missing = defineMissingFile(structure, id, child);
             if (!missing && !isPart && instanceCount < 1)
                 continue;
+            if (!isPart && std::find(ancestors.begin(), ancestors.end(), id) != ancestors.end())
+                throw std::runtime_error("Reference contains itself");
             VizPSEntry* entry = nullptr;
             VizPSInstanceBuilder::MakeVizPSInstance(instance, child, entry);
             if (entry) {
                 parent->AddChild(entry);
                 structure.AddSubAssembly(id, entry);
                 // Inside the guard: a failure below is recorded again under this child.
-                if (!isPart)
-                    loadReferenceStructure(structure, child, entry);
+                if (!isPart) {
+                    ancestors.push_back(id);
+                    struct PopOnExit {
+                        std::vector<int>& path;
+                        ~PopOnExit() { path.pop_back(); }
+                    } const pop{ancestors};
+                    loadReferenceStructure(structure, child, entry, ancestors);
+                }
             }
         } catch (std::exception const& e) {
             recordStructureException(structure, id, e, &VizProductStructure::appendImportError);
@@ -285,9 +296,8 @@ void VizBuilder::resetTimers() {
     m_totalImportSemanticPMITime = 0.0;
 }
 
-// The three phases import what the importers of the import library give. They grow with
-// the modeler, visualisation and PMI importers; until then there is nothing to import.
-void VizBuilder::loadProductStructureInstanceData() {}
+// The product-level phases import what the product-level importers of the import library
+// give; until those exist there is nothing at product level to import.
 void VizBuilder::loadProductStructureGraphicalData() {}
 void VizBuilder::loadProductStructureAssemblyData() {}
 

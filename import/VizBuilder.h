@@ -5,15 +5,19 @@
 #include "model/VizTypes.h"
 
 #include <map>
+#include <vector>
 
 class TarvexDocument;
+class TarvexEntity;
 class TarvexInputProductStructure;
 class TarvexInputPSReference;
+class TarvexPMIData;
 class TarvexPolicy;
 class TarvexPSImportResult;
 
 namespace VizBridgeTarvex {
 
+class SemanticPMIBatch;
 class VizModelerServices;
 class VizPartContainer;
 class VizProductStructure;
@@ -76,8 +80,12 @@ public:
     int GetNumberOfProcessorsUsed() const { return m_numberOfProcessorsUsed; }
 
 private:
+    friend class VizBuilderTestPeer; // lets the tests reach the entity walk directly
+    /// `ancestors` holds the sub-assemblies from the root down to `reference`: a child that
+    /// stands among them would contain itself and is refused as a failure of that child.
     static void loadReferenceStructure(VizProductStructure& structure,
-                                       TarvexInputPSReference const& reference, VizPSEntry* parent);
+                                       TarvexInputPSReference const& reference, VizPSEntry* parent,
+                                       std::vector<int>& ancestors);
     static bool defineMissingFile(VizProductStructure& structure, int const& id,
                                   TarvexInputPSReference const& reference);
     static void getDocumentInfo(TarvexDocument& document, VizProductStructure& structure);
@@ -88,6 +96,28 @@ private:
     void loadProductStructureInstanceData();
     void loadProductStructureGraphicalData();
     void loadProductStructureAssemblyData();
+
+    // Instance data phase.
+    void importContainersFromTarvex_SingleProc();
+    void importContainersFromTarvex_MultiProc(int const& total);
+    void defineReference(TarvexInputPSReference const& reference, int* counter);
+    /// `ancestors` as for loadReferenceStructure: a sub-assembly that contains itself was
+    /// reported when the tree was built and is passed over here.
+    void defineReference(TarvexInputPSReference const& reference, int* counter,
+                         std::vector<int>& ancestors);
+    void importBREPFromReference(TarvexInputPSReference const& reference,
+                                 SemanticPMIByReference& semanticPMI);
+    VizPartContainer* getVizPartContainerFromReference(TarvexInputPSReference const& reference,
+                                                       TarvexEntity entity, WString& path);
+    void importVisuDataFromReference(TarvexInputPSReference const& reference);
+    void processSemanticPMI(TarvexPMIData& data, SemanticPMIByReference& semanticPMI);
+    /// Gives every inner map's records to the structure and frees the inner maps.
+    void handOverSemanticPMI(SemanticPMIBatch& batch);
+
+    /// Calls the progress callback, if one is set, with `text` (null: no text).
+    void reportProgress(int const& current, int const& total, WString const* text) const;
+    /// "Importing <modeler name> BREP from <name>".
+    WString brepProgressText(WString const& referenceName) const;
 
     VizProductStructure& m_productStructure;                    ///< not owned
     TarvexInputProductStructure const& m_inputProductStructure; ///< not owned

@@ -55,14 +55,13 @@ public:
 
     /// `box` of a part moved by the instance's `transformation` and pushed away from the
     /// product's origin by the explode factors.
-    virtual VizBox ExplodeBox(VizTransf const& transformation, VizBox const& box,
-                              double const& x, double const& y, double const& z) = 0;
+    virtual VizBox ExplodeBox(VizTransf const& transformation, VizBox const& box, double const& x,
+                              double const& y, double const& z) = 0;
 
     /// The entity that element `*index` (from 0) of `annotation` is linked to, in
     /// `container`. True when `entity` was filled.
-    virtual bool GetAnnotationEntityId(VizPartContainer* container,
-                                       TarvexPMIAnnotation& annotation, int* index,
-                                       EntityId& entity) = 0;
+    virtual bool GetAnnotationEntityId(VizPartContainer* container, TarvexPMIAnnotation& annotation,
+                                       int* index, EntityId& entity) = 0;
 
     /// The id of an import-library entity of `container`. True when `id` was filled.
     virtual bool GetEntityId(VizPartContainer* container, TarvexEntity& entity, EntityId& id) = 0;

@@ -12,8 +12,8 @@ class TarvexModelData;
 class TarvexEntity {
 public:
     TarvexEntity() = default;
-    TarvexEntity(std::shared_ptr<TarvexModelData const> data, std::vector<unsigned int> instancePath,
-                 unsigned int entityId)
+    TarvexEntity(std::shared_ptr<TarvexModelData const> data,
+                 std::vector<unsigned int> instancePath, unsigned int entityId)
         : m_data(std::move(data)), m_instancePath(std::move(instancePath)), m_entityId(entityId) {}
 
     /// True and `instanceEntity` filled when the entity lies below an instance.
@@ -22,6 +22,9 @@ public:
     unsigned int GetEntityId() const;
 
 private:
+    // An instance entity asks the fault plan of the model its entity belongs to.
+    friend class TarvexInstanceEntity;
+
     std::shared_ptr<TarvexModelData const> m_data;
     std::vector<unsigned int> m_instancePath;
     unsigned int m_entityId = 0;

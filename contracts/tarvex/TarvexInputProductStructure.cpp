@@ -45,3 +45,18 @@ TarvexLengthUnitType TarvexInputProductStructure::GetUnits() const {
     m_data->faults.Check("TarvexInputProductStructure::GetUnits", 0);
     return m_data->unit;
 }
+
+TarvexInputPSReference TarvexInputProductStructure::GetReferenceFromId(int id) const {
+    if (!m_data) {
+        return TarvexInputPSReference();
+    }
+    m_data->faults.Check("TarvexInputProductStructure::GetReferenceFromId", 0);
+    if (id < 0) {
+        return TarvexInputPSReference();
+    }
+    unsigned int const referenceId = m_data->ResolveDeliveredId(static_cast<unsigned int>(id));
+    if (m_data->FindReference(referenceId) == nullptr) {
+        return TarvexInputPSReference();
+    }
+    return TarvexInputPSReference(m_data, referenceId);
+}

@@ -28,5 +28,9 @@ public:
     TarvexInputPSReference GetReferenceFromId(int id) const;
 
 private:
+    // The spooler converts the parts of this product without asking the fault plan of every
+    // reference on the way.
+    friend class TarvexMultiProcessSpooler;
+
     std::shared_ptr<TarvexModelData const> m_data;
 };

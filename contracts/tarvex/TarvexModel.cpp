@@ -4,6 +4,7 @@
 #include "contracts/tarvex/TarvexInputProductStructure.h"
 #include "contracts/tarvex/TarvexModelData.h"
 #include "contracts/tarvex/TarvexPSImportResult.h"
+#include "contracts/tarvex/TarvexPartConversion.h"
 
 #include <stdexcept>
 #include <string>
@@ -110,6 +111,31 @@ void TarvexModel::AddMissingFile(std::optional<VizPort::WString> name) {
 
 TarvexFaultPlan& TarvexModel::Faults() {
     return data().faults;
+}
+
+void TarvexModel::SetSpoolerDeliveryOrder(std::vector<unsigned int> order) {
+    data().spoolerDeliveryOrder = std::move(order);
+}
+
+void TarvexModel::SetSpoolerIdAlias(unsigned int referenceId, unsigned int deliveredId) {
+    data().spoolerIdAliases[referenceId] = deliveredId;
+}
+
+int TarvexModel::GetConversionCount(unsigned int referenceId) const {
+    return m_data ? m_data->conversions.GetConversionCount(referenceId) : 0;
+}
+
+std::optional<std::thread::id> TarvexModel::GetConversionThread(unsigned int referenceId) const {
+    return m_data ? m_data->conversions.GetConversionThread(referenceId) : std::nullopt;
+}
+
+TarvexEntity TarvexModel::MakeEntity(std::vector<unsigned int> instancePath,
+                                     unsigned int entityId) const {
+    return TarvexEntity(m_data, std::move(instancePath), entityId);
+}
+
+TarvexPMIAnnotation TarvexModel::MakeAnnotation(std::vector<TarvexEntity> linkedElements) const {
+    return TarvexPMIAnnotation(m_data, std::move(linkedElements));
 }
 
 TarvexPSImportResult TarvexModel::GetImportResult() const {

@@ -10,6 +10,7 @@
 
 #include <memory>
 #include <optional>
+#include <thread>
 #include <vector>
 
 class TarvexDocument;
@@ -44,9 +45,9 @@ public:
     /// A unique id that is already used replaces nothing: the existing record is returned.
     TarvexAuthoredReference& AddPart(unsigned int uniqueId, std::optional<VizPort::WString> name,
                                      std::optional<VizPort::WString> storageName = std::nullopt);
-    TarvexAuthoredReference& AddAssembly(unsigned int uniqueId,
-                                         std::optional<VizPort::WString> name,
-                                         std::optional<VizPort::WString> storageName = std::nullopt);
+    TarvexAuthoredReference&
+    AddAssembly(unsigned int uniqueId, std::optional<VizPort::WString> name,
+                std::optional<VizPort::WString> storageName = std::nullopt);
     /// The record of a reference added before, or null.
     TarvexAuthoredReference* FindReference(unsigned int uniqueId);
 
@@ -73,6 +74,13 @@ public:
     /// GetReferenceFromId(deliveredId) gives reference `referenceId`: a delivery whose id
     /// does not match its reference.
     void SetSpoolerIdAlias(unsigned int referenceId, unsigned int deliveredId);
+
+    // Diagnostics of the part conversions, for tests.
+    /// How many times the part `referenceId` was converted, by the spooler's workers or by
+    /// TarvexPartDocument::GetConvertedPart: at most 1 unless a conversion ran out of memory.
+    int GetConversionCount(unsigned int referenceId) const;
+    /// The thread that converted the part `referenceId`; std::nullopt if none did yet.
+    std::optional<std::thread::id> GetConversionThread(unsigned int referenceId) const;
 
     // Entities.
     /// An entity `entityId` of a part, reached through `instancePath` (instance authoring

@@ -35,3 +35,12 @@ int TarvexModelData::CountReachableReferences() const {
     }
     return static_cast<int>(visited.size());
 }
+
+unsigned int TarvexModelData::ResolveDeliveredId(unsigned int deliveredId) const {
+    for (auto const& [referenceId, aliasId] : spoolerIdAliases) {
+        if (aliasId == deliveredId) {
+            return referenceId;
+        }
+    }
+    return deliveredId;
+}

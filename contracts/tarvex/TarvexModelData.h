@@ -6,6 +6,7 @@
 #include "contracts/tarvex/TarvexAuthoredReference.h"
 #include "contracts/tarvex/TarvexFaultPlan.h"
 #include "contracts/tarvex/TarvexLengthUnitType.h"
+#include "contracts/tarvex/TarvexPartConversion.h"
 
 #include <deque>
 #include <map>
@@ -32,6 +33,13 @@ public:
     TarvexAuthoredDocument document;
     std::vector<std::optional<VizPort::WString>> missingFiles;
     TarvexFaultPlan faults;
+    /// Reference ids that the spooler delivers first, in this order.
+    std::vector<unsigned int> spoolerDeliveryOrder;
+    /// Delivered id by reference id: the spooler hands the reference over under another id.
+    std::map<unsigned int, unsigned int> spoolerIdAliases;
+    /// The parts converted so far. Mutable: value objects hold the data as const, and a
+    /// conversion on first use changes no authored value. Thread-safe on its own.
+    mutable TarvexPartConversion conversions;
 
     /// Null when the model does not know `uniqueId`.
     TarvexAuthoredReference const* FindReference(unsigned int uniqueId) const;
@@ -39,4 +47,7 @@ public:
     TarvexAuthoredInstance const* FindInstance(unsigned int instanceId) const;
     /// The defined references reachable from the root instances, each counted once.
     int CountReachableReferences() const;
+    /// The reference that the spooler delivers as `deliveredId`: the one aliased to it if
+    /// any (the smallest reference id when several are), otherwise `deliveredId` itself.
+    unsigned int ResolveDeliveredId(unsigned int deliveredId) const;
 };

@@ -22,10 +22,14 @@ public:
 
     /// Starts converting every unique part reference to `representation` on
     /// min(processors to use, parts) workers. Answers false if a conversion already runs.
+    /// A spooler converts once: a second call answers false, also after the first finished.
+    /// Only TarvexRep_BREP is converted ahead of time; any other representation answers false
+    /// and starts nothing, so the spooler stays complete.
     bool InitiateConversion(TarvexRep representation);
     /// True once every reference has been delivered (and at once if nothing was started).
     bool IsComplete() const;
-    /// True and `id` set to the next converted reference, if one is ready.
+    /// True and `id` set to the next converted reference, if one is ready; `id` is left alone
+    /// otherwise. Never waits for a conversion.
     bool HasDataAvailableFor(unsigned int& id) const;
     /// The representation of the reference delivered last: TarvexRep_None if its conversion
     /// failed.

@@ -15,6 +15,9 @@ public:
     unsigned int GetReferenceId() const { return m_referenceId; }
 
 private:
+    // The result of a part import asks the fault plan of the model its PMI belongs to.
+    friend class TarvexPartImportResult;
+
     std::shared_ptr<TarvexModelData const> m_data;
     unsigned int m_referenceId = 0;
 };
