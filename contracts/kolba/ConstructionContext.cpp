@@ -1,0 +1,9 @@
+#include "contracts/kolba/ConstructionContext.h"
+
+namespace KolbaVizCore {
+
+ConstructionContext::ConstructionContext(SceneBuilder* builder) : ASceneBuilderContext(builder) {
+    openConstruction();
+}
+
+} // namespace KolbaVizCore

@@ -1,0 +1,13 @@
+#pragma once
+
+#include "contracts/kolba/ASceneBuilderContext.h"
+
+namespace KolbaVizCore {
+
+/// Brackets one construction of the scene; opens no node.
+class ConstructionContext : public ASceneBuilderContext {
+public:
+    ConstructionContext(SceneBuilder* builder);
+};
+
+} // namespace KolbaVizCore

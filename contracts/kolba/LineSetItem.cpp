@@ -1,0 +1,18 @@
+#include "contracts/kolba/LineSetItem.h"
+
+#include <utility>
+
+namespace KolbaVizCore {
+
+LineSetItem::LineSetItem(unsigned long tag, std::vector<float> coordinates)
+    : GeometryItem(Type::LineSet, tag), m_coordinates(std::move(coordinates)) {}
+
+void LineSetItem::AddToBox(Matrix4 const& world, VizBox& box) const {
+    addPointsToBox(m_coordinates, world, box);
+}
+
+std::string LineSetItem::describeData() const {
+    return "pts=" + std::to_string(GetPointCount());
+}
+
+} // namespace KolbaVizCore

@@ -1,0 +1,11 @@
+#include "contracts/kolba/VizEdge.h"
+
+namespace KolbaVizCore {
+
+void VizEdge::RemoveTransparency() {
+    RGBAColor color = GetColor();
+    color.alpha = 255;
+    SetColorState(HasColor(), color);
+}
+
+} // namespace KolbaVizCore
