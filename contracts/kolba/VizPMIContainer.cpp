@@ -1,5 +1,7 @@
 #include "contracts/kolba/VizPMIContainer.h"
 
+#include <algorithm>
+
 namespace KolbaVizCore {
 
 void VizPMIContainer::AddSemanticPMI(SemanticPMI* record) {
@@ -30,6 +32,40 @@ bool VizPMIContainer::GetSemanticPMIAsString(VizPort::WString const& key,
     if (found == m_semanticPMI.end())
         return false;
     text = found->second->ToString();
+    return true;
+}
+
+VizPMI* VizPMIContainer::GetVizPMI(VizPort::WString const& mechanicalId) const {
+    if (mechanicalId.empty())
+        return nullptr;
+    for (VizPMI* pmi : m_pmis.Get())
+        if (pmi->GetMechanicalID() == mechanicalId)
+            return pmi;
+    return nullptr;
+}
+
+bool VizPMIContainer::GetBREPLinks(VizPort::WString const& mechanicalId,
+                                   std::vector<EntityId>& links) const {
+    auto const found = m_semanticPMI.find(mechanicalId);
+    if (found == m_semanticPMI.end())
+        return false;
+    links = found->second->BREPLinks;
+    return true;
+}
+
+bool VizPMIContainer::GetPMILinks(VizPort::WString const& mechanicalId,
+                                  std::vector<VizPort::WString>& links) const {
+    VizPMI const* const pmi = GetVizPMI(mechanicalId);
+    if (pmi == nullptr)
+        return false;
+    std::vector<VizPort::WString> found;
+    for (VizPort::WString const& linked : pmi->GetLinkedEntityMechIDs()) {
+        // A link to a face or an edge has a mechanical id too: only PMI objects count here.
+        if (GetVizPMI(linked) != nullptr &&
+            std::find(found.begin(), found.end(), linked) == found.end())
+            found.push_back(linked);
+    }
+    links = std::move(found);
     return true;
 }
 

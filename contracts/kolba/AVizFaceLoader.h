@@ -1,0 +1,21 @@
+#pragma once
+
+#include "contracts/kolba/AVizElementLoader.h"
+#include "contracts/kolba/VizFace.h"
+
+#include <memory>
+
+namespace KolbaVizCore {
+
+/// Base of the loaders of a face: makeOne makes an empty VizFace. loadOne is left to the
+/// derived loader.
+class AVizFaceLoader : public AVizElementLoader {
+public:
+    AVizFaceLoader() = default;
+    ~AVizFaceLoader() override = default;
+
+protected:
+    VizElement* makeOne() override { return keep(std::make_unique<VizFace>()); }
+};
+
+} // namespace KolbaVizCore

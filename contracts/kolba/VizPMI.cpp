@@ -1,0 +1,11 @@
+#include "contracts/kolba/VizPMI.h"
+
+namespace KolbaVizCore {
+
+VizPort::WString VizPMI::ToString() const {
+    if (m_name.empty())
+        return VizPort::WString();
+    return u"PMI : " + m_name;
+}
+
+} // namespace KolbaVizCore
