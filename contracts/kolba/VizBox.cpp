@@ -61,13 +61,13 @@ void VizBox::GetCenter(double* center) const {
 void VizBox::Scale(double const& factor) {
     if (IsEmpty())
         return;
-    // Mirroring about the centre gives the same box: only the size of the factor counts.
-    double const size = std::fabs(factor);
-    double center[3];
-    GetCenter(center);
+    // About the origin, as a uniform scale transformation moves the points inside the box;
+    // a negative factor mirrors, so the corners may swap.
     for (int axis = 0; axis < 3; ++axis) {
-        m_low[axis] = center[axis] + (m_low[axis] - center[axis]) * size;
-        m_high[axis] = center[axis] + (m_high[axis] - center[axis]) * size;
+        double const a = m_low[axis] * factor;
+        double const b = m_high[axis] * factor;
+        m_low[axis] = std::min(a, b);
+        m_high[axis] = std::max(a, b);
     }
 }
 

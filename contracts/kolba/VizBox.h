@@ -15,7 +15,8 @@ public:
     double const* GetHigh() const { return m_high; }
     /// Writes the centre into `center` (3 doubles); all zero for an empty box.
     void GetCenter(double* center) const;
-    /// Scales the box about its centre; an empty box stays empty.
+    /// Scales the box about the origin, as VizTransf(factor) moves its points; an empty box
+    /// stays empty.
     void Scale(double const& factor);
 
     bool operator==(VizBox const& other) const;
