@@ -5,8 +5,10 @@
 #include "contracts/tarvex/TarvexPMIAnnotation.h"
 #include "contracts/tarvex/TarvexPartDocument.h"
 #include "contracts/tarvex/TarvexPartImportResult.h"
+#include "examples/ReferenceModeler/ReferenceBrepRenderer.h"
 #include "examples/ReferenceModeler/ReferencePartContainer.h"
 
+#include <cstdint>
 #include <memory>
 #include <stdexcept>
 #include <utility>
@@ -57,19 +59,34 @@ WString ReferenceModelerServices::GetName() {
 
 bool ReferenceModelerServices::ConvertToEntity(unsigned long const& id, VizPartContainer* container,
                                                EntityId& entity) {
-    return findEntity(id, container, entity);
+    auto const* const part = dynamic_cast<ReferencePartContainer const*>(container);
+    if (part == nullptr)
+        return false;
+    std::uint32_t const body = static_cast<std::uint32_t>(part->GetRefID());
+    // The caller walks every part with the same path until one answers: without this, a
+    // part with a face of the picked id would answer for a pick on another part.
+    if (entity.GetParentId() != body)
+        return false;
+    if (findEntity(id, container, entity))
+        return true;
+    if (id != body)
+        return false;
+    entity = EntityId(body, KolbaVizCore::Body, body);
+    return true;
 }
 
 bool ReferenceModelerServices::Reserved4() {
     return false;
 }
 
-KolbaVizCore::ARenderer* ReferenceModelerServices::CreateRenderer(VizPartContainer*,
-                                                                  KolbaVizCore::SceneBuilder*,
-                                                                  RenderId*) {
-    // Drawing comes with the scene library's renderer family, which this modeler cannot
-    // derive from yet; a null renderer makes the caller draw no BREP for the part.
-    return nullptr;
+KolbaVizCore::ARenderer*
+ReferenceModelerServices::CreateRenderer(VizPartContainer* container,
+                                         KolbaVizCore::SceneBuilder* builder, RenderId* current) {
+    auto const* const part = dynamic_cast<ReferencePartContainer const*>(container);
+    if (part == nullptr || builder == nullptr)
+        return nullptr;
+    // The interface hands the renderer to the caller, who deletes it.
+    return new ReferenceBrepRenderer(*part, *builder, current != nullptr ? *current : RenderId());
 }
 
 VizBridgeTarvex::VizModelerServices* ReferenceModelerServices::Clone() {

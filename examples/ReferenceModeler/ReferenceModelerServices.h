@@ -20,8 +20,9 @@ using VizBridgeTarvex::WString;
 class ReferencePartContainer;
 
 /// A working modeler for hosts, demos and tests: it imports a part as the document's
-/// tessellated faces and edges (a ReferencePartContainer), names them by their authored
-/// entity ids, and explodes boxes.
+/// tessellated faces and edges (a ReferencePartContainer), draws it with a
+/// ReferenceBrepRenderer, names faces and edges by their authored entity ids, and explodes
+/// boxes.
 ///
 /// For tests of the callers it can fail on demand, per reference id, in each of the ways
 /// an ImportPart may fail, and it records on which thread each ImportPart ran.
@@ -61,10 +62,24 @@ public:
     std::vector<ImportCall> GetImportCalls() const;
 
     WString GetName() override;
+    /// Reads a path the way ReferenceBrepRenderer draws it: `entity` comes filled with the
+    /// tag of the body node as its parent id, which is the reference id of the part the path
+    /// runs through. So a container answers only for paths through its own part, even where
+    /// another part has a face or edge of the same id. `id` then names
+    ///   - a face or edge of the part: (refId, Face / Edge, id), faces looked up first, so an
+    ///     id that names both gives the face (the renderer's Convert tells them apart by the
+    ///     path);
+    ///   - else the reference id itself, for a path that ends at the body: (refId, Body,
+    ///     refId).
+    /// These are the entities ReferenceBrepRenderer::Convert gives for the same paths. False,
+    /// and `entity` untouched, otherwise.
     bool ConvertToEntity(unsigned long const& id, VizPartContainer* container,
                          EntityId& entity) override;
     bool Reserved4() override;
-    /// Null: drawing a part comes with the scene library's renderer family.
+    /// A new ReferenceBrepRenderer for a ReferencePartContainer, which the interface hands
+    /// to the caller to delete. It points at `container` and `builder` without owning them,
+    /// and draws below the node `current` names (null: the node current at its Render).
+    /// Null for a null container, another modeler's container, or a null builder.
     KolbaVizCore::ARenderer* CreateRenderer(VizPartContainer* container,
                                             KolbaVizCore::SceneBuilder* builder,
                                             RenderId* current) override;

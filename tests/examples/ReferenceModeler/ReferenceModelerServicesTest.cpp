@@ -282,22 +282,50 @@ TEST_F(ReferenceModelerEntities, GetAnnotationEntityIdTakesTheIndexedLinkedEleme
     EXPECT_TRUE(id == untouched);
 }
 
-TEST_F(ReferenceModelerEntities, ConvertToEntityNamesTheFaceOrEdgeOfThePart) {
-    EntityId entity = untouched;
-    ASSERT_TRUE(services.ConvertToEntity(101, pin.container.get(), entity));
-    EXPECT_TRUE(entity == EntityId(PinId, KolbaVizCore::Face, 101));
-    ASSERT_TRUE(services.ConvertToEntity(201, pin.container.get(), entity));
-    EXPECT_TRUE(entity == EntityId(PinId, KolbaVizCore::Edge, 201));
+TEST_F(ReferenceModelerEntities, ConvertToEntityNamesTheFaceEdgeOrBodyOfThePart) {
+    // The caller fills the parent id from the body tag of the picked path: Pin's id here.
+    struct Case {
+        unsigned long id;
+        EntityId expected;
+    };
+    for (Case const& c : {Case{101, EntityId(PinId, KolbaVizCore::Face, 101)},
+                          Case{201, EntityId(PinId, KolbaVizCore::Edge, 201)},
+                          Case{PinId, EntityId(PinId, KolbaVizCore::Body, PinId)}}) {
+        SCOPED_TRACE(c.id);
+        EntityId entity(PinId, 0xFFFFFFFFu, static_cast<std::uint32_t>(c.id));
+        ASSERT_TRUE(services.ConvertToEntity(c.id, pin.container.get(), entity));
+        EXPECT_TRUE(entity == c.expected);
+    }
+}
 
-    entity = untouched;
-    EXPECT_FALSE(services.ConvertToEntity(999, pin.container.get(), entity));
+TEST_F(ReferenceModelerEntities, ConvertToEntityAnswersFalseForWhatThePartDoesNotHold) {
+    EntityId const throughPin(PinId, 0xFFFFFFFFu, 0);
+    EntityId const throughBolt(BoltId, 0xFFFFFFFFu, 0);
+    struct Case {
+        char const* what;
+        unsigned long id;
+        EntityId entity;
+        VizPartContainer* container;
+    };
+    VizBridgeTarvex::TestPartContainer foreign(u"Foreign", static_cast<int>(PinId));
+    std::vector<Case> cases{
+        {"no such face", 999, throughPin, pin.container.get()},
+        {"a face of Pin on a path through Bolt", 101, throughBolt, pin.container.get()},
+        {"Bolt's body id on a path through Pin", BoltId, throughPin, pin.container.get()},
+        {"no container", 101, throughPin, nullptr},
+        {"another modeler's container", 101, throughPin, &foreign},
+    };
     // 101 in the low 32 bits: a truncating lookup would find face 101.
     if (sizeof(unsigned long) > sizeof(unsigned int)) {
-        unsigned long const wide = std::numeric_limits<unsigned int>::max() + 102ul;
-        EXPECT_FALSE(services.ConvertToEntity(wide, pin.container.get(), entity));
+        cases.push_back({"a wide id", std::numeric_limits<unsigned int>::max() + 102ul, throughPin,
+                         pin.container.get()});
     }
-    EXPECT_FALSE(services.ConvertToEntity(101, nullptr, entity));
-    EXPECT_TRUE(entity == untouched);
+    for (Case const& c : cases) {
+        SCOPED_TRACE(c.what);
+        EntityId entity = c.entity;
+        EXPECT_FALSE(services.ConvertToEntity(c.id, c.container, entity));
+        EXPECT_TRUE(entity == c.entity);
+    }
 }
 
 } // namespace
