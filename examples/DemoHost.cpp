@@ -3,6 +3,10 @@
 
 #include "examples/SampleAssembly.h"
 
+#include "contracts/kolba/DefaultGeometryItemFactory.h"
+#include "contracts/kolba/RecordingView3D.h"
+#include "contracts/kolba/SceneBuilder.h"
+#include "contracts/kolba/View3DAdapter.h"
 #include "contracts/platform/DebugOutput.h"
 #include "contracts/platform/WString.h"
 #include "contracts/tarvex/TarvexDocument.h"
@@ -12,6 +16,7 @@
 #include "examples/ReferenceModeler/ReferenceModelerServices.h"
 #include "import/VizBuilder.h"
 #include "model/VizProductStructure.h"
+#include "render/TarvexRenderer.h"
 
 #include <exception>
 #include <iostream>
@@ -116,6 +121,37 @@ void PrintTimes(ImportTimes const& times) {
               << "Processors used: " << times.processors << '\n';
 }
 
+/// The render's progress callback: called on the rendering thread, phase as a narrow text.
+void PrintRenderProgress(int const& done, int const& total, char const* phase) {
+    std::cout << "  render " << phase << ' ' << done << '/' << total << '\n';
+}
+
+/// Step 4: a renderer draws the structure into the host's scene. The host keeps the scene
+/// builder, the view and the modeler alive for as long as the renderer lives; deleting the
+/// renderer removes what it drew.
+void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModelerServices& modeler) {
+    KolbaVizCore::RecordingView3D view;
+    KolbaVizCore::SceneBuilder scene;
+    KolbaVizCore::View3DAdapter adapter(&view, &scene);
+    scene.SetView3DAdapter(&adapter);
+    scene.SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
+
+    std::unique_ptr<VizBridgeTarvex::TarvexRenderer> renderer(
+        VizBridgeTarvex::TarvexRenderer::MakeRenderer(&structure, &modeler, &scene, 0.0, 0.0, 0.0));
+    renderer->SetProgressCallback(&PrintRenderProgress);
+    bool const rendered = renderer->Render();
+    std::cout << "Rendered: " << (rendered ? "yes" : "no") << ", " << scene.GetNodeCount()
+              << " nodes\n"
+              << scene.Dump();
+    for (auto const& sphere : view.GetExtentSpheres())
+        std::cout << "Extents: centre (" << sphere.center[0] << ", " << sphere.center[1] << ", "
+                  << sphere.center[2] << "), radius " << sphere.radius << '\n';
+
+    renderer->ClearAll();
+    std::cout << "After ClearAll: " << scene.GetNodeCount() << " node(s)\n" << scene.Dump();
+    renderer.reset(); // before the scene it drew into
+}
+
 } // namespace
 
 /// The whole road once, with the import spread over `processors` processes (0: all the
@@ -136,6 +172,8 @@ void RunRoad(VizBridgeExamples::SampleAssembly const& sample, int processors) {
     std::cout << "BREP containers: " << structure->GetNumberOfVizPartContainers() << '\n';
     PrintFailures(*structure);
     PrintTimes(times);
+    std::cout << "Rendering\n";
+    RenderStructure(*structure, modeler);
 
     // The structure goes last: after the builder and every renderer made on it.
     structure.reset();
