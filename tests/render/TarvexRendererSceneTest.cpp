@@ -9,6 +9,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -410,4 +411,59 @@ TEST(TarvexRendererScene, MeshesWiresAndPointSetsOfBothKindsShareOneGeometryNode
         names.push_back(geometry->GetChild(i)->GetName());
     EXPECT_EQ(names, (std::vector<WString>{u"Mesh1", u"Mesh2", u"Wire3", u"Wire4", u"PointSet5",
                                            u"PointSet6"}));
+}
+
+TEST(TarvexRendererScene, ARefusedLevelSkipsWhatStandsBelowItAndTheWalkGoesOn) {
+    struct Case {
+        char const* name;
+        std::function<void(KolbaVizCore::SceneBuilder&)> refuse;
+        std::vector<std::vector<std::uint32_t>> present; ///< tags below the product
+        std::vector<std::vector<std::uint32_t>> absent;
+        bool productNode;
+    };
+    std::vector<Case> const cases = {
+        {"an instance: its index is still used",
+         [](auto& b) { b.FailContextsNamed(u"P.1"); },
+         {{1001}, {1002, 10007}},
+         {{1000}},
+         true},
+        {"every Part node: the instances stand, empty",
+         [](auto& b) { b.FailContextsTagged(10007); },
+         {{1000}, {1001}},
+         {{1000, 10007}, {1001, 10007}},
+         true},
+        {"the product",
+         [](auto& b) { b.FailContextsOfKind(KolbaVizCore::ContextKind::Container); },
+         {},
+         {},
+         false},
+        {"the construction",
+         [](auto& b) { b.FailContextsOfKind(KolbaVizCore::ContextKind::Construction); },
+         {},
+         {},
+         false},
+    };
+    for (Case const& c : cases) {
+        SCOPED_TRACE(c.name);
+        RenderScene scene;
+        auto structure = plate(false);
+        c.refuse(scene.builder);
+        TarvexRendererProbe renderer(structure.get(), &scene.builder, nullptr);
+        EXPECT_TRUE(renderer.Render()) << "a refused level is no failure";
+        EXPECT_EQ(scene.builder.GetOpenLevelCount(), 0);
+        ASSERT_EQ(!renderer.GetProductRenderId().IsEmpty(), c.productNode);
+        if (!c.productNode)
+            continue;
+        std::uint32_t const T = productTag(renderer);
+        auto const below = [&](std::vector<std::uint32_t> const& tags) {
+            RenderId path = pathOf({1, T});
+            for (std::uint32_t const tag : tags)
+                path.AddValue(tag);
+            return scene.builder.FindNode(path);
+        };
+        for (auto const& tags : c.present)
+            EXPECT_NE(below(tags), nullptr) << tags.back();
+        for (auto const& tags : c.absent)
+            EXPECT_EQ(below(tags), nullptr) << tags.back();
+    }
 }
