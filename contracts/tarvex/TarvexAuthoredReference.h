@@ -2,6 +2,7 @@
 
 #include "contracts/platform/WString.h"
 #include "contracts/tarvex/TarvexAuthoredPartGeometry.h"
+#include "contracts/tarvex/TarvexAuthoredVisuData.h"
 
 #include <optional>
 #include <vector>
@@ -18,4 +19,7 @@ struct TarvexAuthoredReference {
     std::vector<unsigned int> instances;
     /// The part document's geometry; read only for parts.
     TarvexAuthoredPartGeometry geometry;
+    /// The visualisation data of the reference's document, which
+    /// TarvexVisualizationImporter reads.
+    TarvexAuthoredVisuData visu;
 };

@@ -134,6 +134,18 @@ TarvexEntity TarvexModel::MakeEntity(std::vector<unsigned int> instancePath,
     return TarvexEntity(m_data, std::move(instancePath), entityId);
 }
 
+TarvexEntity TarvexModel::MakeEntity(TarvexAuthoredEntity entity) const {
+    return TarvexEntity(m_data, std::move(entity));
+}
+
+void TarvexModel::SetFontDirectory(std::optional<std::string> directory) {
+    data().fonts.SetDirectory(std::move(directory));
+}
+
+std::vector<TarvexImportCall> TarvexModel::GetImportCalls() const {
+    return m_data ? m_data->importLog.Get() : std::vector<TarvexImportCall>();
+}
+
 TarvexPMIAnnotation TarvexModel::MakeAnnotation(std::vector<TarvexEntity> linkedElements) const {
     return TarvexPMIAnnotation(m_data, std::move(linkedElements));
 }

@@ -5,11 +5,13 @@
 #include "contracts/tarvex/TarvexAuthoredReference.h"
 #include "contracts/tarvex/TarvexEntity.h"
 #include "contracts/tarvex/TarvexFaultPlan.h"
+#include "contracts/tarvex/TarvexImportCall.h"
 #include "contracts/tarvex/TarvexLengthUnitType.h"
 #include "contracts/tarvex/TarvexPMIAnnotation.h"
 
 #include <memory>
 #include <optional>
+#include <string>
 #include <thread>
 #include <vector>
 
@@ -20,7 +22,8 @@ class TarvexModelData;
 
 /// The in-memory document model behind the library's value objects, and the authoring API
 /// through which a host or test fills it. The value objects handed out share the model's
-/// data and keep it alive; authoring after they were handed out is seen by them.
+/// data and keep it alive; authoring after they were handed out is seen by them, except by
+/// visualisation data, which an import copies as it stands.
 /// Not thread-safe while authoring; reading through value objects is.
 /// A moved-from model hands out empty value objects, and its next authoring call starts a
 /// new, empty model.
@@ -86,8 +89,16 @@ public:
     /// An entity `entityId` of a part, reached through `instancePath` (instance authoring
     /// ids from the top; empty: in the part itself).
     TarvexEntity MakeEntity(std::vector<unsigned int> instancePath, unsigned int entityId) const;
+    TarvexEntity MakeEntity(TarvexAuthoredEntity entity) const;
     /// An annotation linked to `linkedElements`.
     TarvexPMIAnnotation MakeAnnotation(std::vector<TarvexEntity> linkedElements) const;
+
+    // Visualisation data, authored in each reference's `visu` record.
+    /// The directory in which the text builder looks for its font files; std::nullopt: the
+    /// system's DejaVu directory (see TarvexFontCache).
+    void SetFontDirectory(std::optional<std::string> directory);
+    /// The importer calls made on this model so far, in order, also those that threw.
+    std::vector<TarvexImportCall> GetImportCalls() const;
 
     // Value objects onto this model.
     TarvexPSImportResult GetImportResult() const;

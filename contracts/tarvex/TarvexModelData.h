@@ -5,6 +5,8 @@
 #include "contracts/tarvex/TarvexAuthoredInstance.h"
 #include "contracts/tarvex/TarvexAuthoredReference.h"
 #include "contracts/tarvex/TarvexFaultPlan.h"
+#include "contracts/tarvex/TarvexFontCache.h"
+#include "contracts/tarvex/TarvexImportLog.h"
 #include "contracts/tarvex/TarvexLengthUnitType.h"
 #include "contracts/tarvex/TarvexPartConversion.h"
 
@@ -40,6 +42,11 @@ public:
     /// The parts converted so far. Mutable: value objects hold the data as const, and a
     /// conversion on first use changes no authored value. Thread-safe on its own.
     mutable TarvexPartConversion conversions;
+    /// The fonts the text builder opened for this model's texts. Mutable for the same reason
+    /// as the conversions; thread-safe on its own.
+    mutable TarvexFontCache fonts;
+    /// The importer calls made on this model. Thread-safe on its own.
+    mutable TarvexImportLog importLog;
 
     /// Null when the model does not know `uniqueId`.
     TarvexAuthoredReference const* FindReference(unsigned int uniqueId) const;

@@ -28,6 +28,9 @@ public:
     TarvexPMIData GetPMIData() const;
 
 private:
+    // The importer reads the document's data from its model.
+    friend class TarvexVisualizationImporter;
+
     std::shared_ptr<TarvexModelData const> m_data;
     unsigned int m_referenceId = 0;
 };

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "contracts/platform/WString.h"
+#include "contracts/tarvex/TarvexAuthoredEntity.h"
+#include "contracts/tarvex/TarvexAuthoredVisuAttributes.h"
+#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
+
+#include <array>
+#include <optional>
+#include <vector>
+
+/// A text of a PMI: the string, where it stands and how it runs. The direction runs along
+/// the text; the normal faces the reader.
+struct TarvexAuthoredVisuText {
+    std::optional<VizPort::WString> text;
+    std::array<float, 3> anchor = {0, 0, 0};
+    std::array<float, 3> direction = {1, 0, 0};
+    std::array<float, 3> normal = {0, 0, 1};
+    std::optional<TarvexAuthoredVisuFont> font;
+    std::optional<std::array<unsigned short, 3>> rgb;
+    std::optional<unsigned short> alpha;
+};
+
+/// A tessellated PMI: its lines, its texts and the entities it points at.
+struct TarvexAuthoredVisuPMI {
+    std::optional<VizPort::WString> displayName;
+    std::optional<VizPort::WString> id;
+    std::optional<VizPort::WString> mechanicalId;
+    std::vector<TarvexAuthoredVisuEdge> edges;
+    std::vector<TarvexAuthoredVisuText> texts;
+    std::vector<TarvexAuthoredEntity> linkedElements;
+};

@@ -1,0 +1,16 @@
+#pragma once
+
+#include "contracts/tarvex/TarvexAuthoredVisuView.h"
+#include "contracts/tarvex/TarvexVisuCapture.h"
+#include "contracts/tarvex/TarvexVisuIterator.h"
+
+/// The captures of visualisation data.
+class TarvexVisuCaptureIter : public TarvexVisuIterator<TarvexVisuCaptureIter, TarvexVisuCapture,
+                                                        TarvexAuthoredVisuCapture> {
+public:
+    using TarvexVisuIterator::TarvexVisuIterator;
+
+    static constexpr char const* kGetCount = "TarvexVisuCaptureIter::GetCount";
+    static constexpr char const* kNext = "TarvexVisuCaptureIter::Next";
+    static constexpr char const* kCurrent = "TarvexVisuCaptureIter::Current";
+};

@@ -1,0 +1,9 @@
+#include "contracts/tarvex/TarvexVisuContext.h"
+
+#include "contracts/tarvex/TarvexModelData.h"
+
+void TarvexVisuContext::Check(char const* operation) const {
+    if (m_model) {
+        m_model->faults.Check(operation, m_subject);
+    }
+}

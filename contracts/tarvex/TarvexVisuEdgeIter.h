@@ -1,0 +1,16 @@
+#pragma once
+
+#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
+#include "contracts/tarvex/TarvexVisuEdge.h"
+#include "contracts/tarvex/TarvexVisuIterator.h"
+
+/// The edges of a mesh, wire or PMI, or the strokes of a laid-out text.
+class TarvexVisuEdgeIter
+    : public TarvexVisuIterator<TarvexVisuEdgeIter, TarvexVisuEdge, TarvexAuthoredVisuEdge> {
+public:
+    using TarvexVisuIterator::TarvexVisuIterator;
+
+    static constexpr char const* kGetCount = "TarvexVisuEdgeIter::GetCount";
+    static constexpr char const* kNext = "TarvexVisuEdgeIter::Next";
+    static constexpr char const* kCurrent = "TarvexVisuEdgeIter::Current";
+};

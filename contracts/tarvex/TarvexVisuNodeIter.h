@@ -1,0 +1,16 @@
+#pragma once
+
+#include "contracts/tarvex/TarvexAuthoredVisuData.h"
+#include "contracts/tarvex/TarvexVisuIterator.h"
+#include "contracts/tarvex/TarvexVisuNode.h"
+
+/// The nodes of visualisation data, in walk order.
+class TarvexVisuNodeIter
+    : public TarvexVisuIterator<TarvexVisuNodeIter, TarvexVisuNode, TarvexAuthoredVisuNode> {
+public:
+    using TarvexVisuIterator::TarvexVisuIterator;
+
+    static constexpr char const* kGetCount = "TarvexVisuNodeIter::GetCount";
+    static constexpr char const* kNext = "TarvexVisuNodeIter::Next";
+    static constexpr char const* kCurrent = "TarvexVisuNodeIter::Current";
+};

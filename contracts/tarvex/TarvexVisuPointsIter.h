@@ -1,0 +1,16 @@
+#pragma once
+
+#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
+#include "contracts/tarvex/TarvexVisuIterator.h"
+#include "contracts/tarvex/TarvexVisuPoints.h"
+
+/// The points of a point set.
+class TarvexVisuPointsIter
+    : public TarvexVisuIterator<TarvexVisuPointsIter, TarvexVisuPoints, TarvexAuthoredVisuPoints> {
+public:
+    using TarvexVisuIterator::TarvexVisuIterator;
+
+    static constexpr char const* kGetCount = "TarvexVisuPointsIter::GetCount";
+    static constexpr char const* kNext = "TarvexVisuPointsIter::Next";
+    static constexpr char const* kCurrent = "TarvexVisuPointsIter::Current";
+};
