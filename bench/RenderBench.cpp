@@ -1,0 +1,352 @@
+// Speed and memory of TarvexRenderer::Render on a product of many instances of few references.
+//
+// The product: 1 000 part references (ids 1..1000), each with tessellated geometry - a
+// VizContainer holding one VizMesh of 20 faces, each face one polygon of 100 triangles, so
+// 2 000 triangles a reference - and N root instances (10 000 or 100 000) that place the
+// references in turn, each at a translation of its own. The renderer draws a reference
+// below its first instance; every further instance gets a node with its placement and a
+// node reference to that drawing.
+//
+// The structure is made once per size; each iteration renders it into an empty scene and
+// then clears the scene outside the timed region, as a host does before drawing again.
+// Memory and counts come from the first render, into a new builder: later renders grow the
+// heap a little less, as the entries keep the render ids they were given the first time.
+//
+// Counters:
+//   instances_per_second        instances rendered per second
+//   items_per_second            geometry items the render put into the scene per second:
+//                               the items the scene's nodes own, one per polygon drawn
+//   items, items_shown, nodes   after one render: items the nodes own, items shown through
+//                               the node references as well, nodes the builder owns
+//   bytes_per_instance          heap growth of one render, divided by N
+//   bytes_per_further_instance  (growth(N) - growth(1 000)) / (N - 1 000): what an instance
+//                               costs beyond the first instance of its reference
+//   drawing_bytes_per_reference growth(1 000) less 1 000 further instances, divided by
+//                               1 000: the drawing of one reference
+// growth(1 000) is the heap growth of rendering the same references with one instance each,
+// measured once for the whole run. Heap bytes are those requested from operator new; the
+// allocator's own overhead is not counted.
+
+#include "contracts/kolba/DefaultGeometryItemFactory.h"
+#include "contracts/kolba/Node.h"
+#include "contracts/kolba/SceneBuilder.h"
+#include "contracts/kolba/VizFace.h"
+#include "contracts/kolba/VizMesh.h"
+#include "contracts/kolba/VizPolygon.h"
+#include "contracts/tarvex/TarvexDocument.h"
+#include "contracts/tarvex/TarvexInputProductStructure.h"
+#include "contracts/tarvex/TarvexModel.h"
+#include "contracts/tarvex/TarvexPSImportResult.h"
+#include "import/VizBuilder.h"
+#include "model/VizProductStructure.h"
+#include "render/TarvexRenderer.h"
+// The import phases fill a structure's containers from the import library; the benchmark
+// hands them over directly, as the tests do.
+#include "tests/support/VizProductStructureTestPeer.h"
+
+#include <benchmark/benchmark.h>
+
+#include <atomic>
+#include <cstddef>
+#include <cstdint>
+#include <cstdlib>
+#include <memory>
+#include <new>
+#include <string>
+#include <vector>
+
+// Live bytes of the whole process, kept by the replaced global operator new and delete
+// below. Each block carries its size in a header that keeps the default new alignment.
+namespace {
+
+std::atomic<std::int64_t> g_liveBytes{0};
+constexpr std::size_t kHeader = __STDCPP_DEFAULT_NEW_ALIGNMENT__;
+
+void* CountedAllocate(std::size_t size) {
+    void* const block = std::malloc(size + kHeader);
+    if (block == nullptr)
+        throw std::bad_alloc();
+    *static_cast<std::size_t*>(block) = size;
+    g_liveBytes.fetch_add(static_cast<std::int64_t>(size), std::memory_order_relaxed);
+    return static_cast<std::byte*>(block) + kHeader;
+}
+
+void CountedFree(void* pointer) noexcept {
+    if (pointer == nullptr)
+        return;
+    void* const block = static_cast<std::byte*>(pointer) - kHeader;
+    g_liveBytes.fetch_sub(static_cast<std::int64_t>(*static_cast<std::size_t*>(block)),
+                          std::memory_order_relaxed);
+    std::free(block);
+}
+
+std::int64_t LiveBytes() {
+    return g_liveBytes.load(std::memory_order_relaxed);
+}
+
+} // namespace
+
+void* operator new(std::size_t size) {
+    return CountedAllocate(size);
+}
+void* operator new[](std::size_t size) {
+    return CountedAllocate(size);
+}
+void operator delete(void* pointer) noexcept {
+    CountedFree(pointer);
+}
+void operator delete[](void* pointer) noexcept {
+    CountedFree(pointer);
+}
+void operator delete(void* pointer, std::size_t) noexcept {
+    CountedFree(pointer);
+}
+void operator delete[](void* pointer, std::size_t) noexcept {
+    CountedFree(pointer);
+}
+// The renderer is made with new (std::nothrow). The standard library's nothrow forms call the
+// plain ones, but a sanitizer runtime brings its own: they are replaced as well.
+void* operator new(std::size_t size, std::nothrow_t const&) noexcept {
+    try {
+        return CountedAllocate(size);
+    } catch (std::bad_alloc const&) {
+        return nullptr;
+    }
+}
+void* operator new[](std::size_t size, std::nothrow_t const&) noexcept {
+    try {
+        return CountedAllocate(size);
+    } catch (std::bad_alloc const&) {
+        return nullptr;
+    }
+}
+void operator delete(void* pointer, std::nothrow_t const&) noexcept {
+    CountedFree(pointer);
+}
+void operator delete[](void* pointer, std::nothrow_t const&) noexcept {
+    CountedFree(pointer);
+}
+
+namespace {
+
+using KolbaVizCore::Node;
+using KolbaVizCore::SceneBuilder;
+using VizBridgeTarvex::TarvexRenderer;
+using VizBridgeTarvex::VizBuilder;
+using VizBridgeTarvex::VizProductStructure;
+using VizBridgeTarvex::VizProductStructureTestPeer;
+
+constexpr unsigned int kReferences = 1000;
+constexpr unsigned int kFacesPerMesh = 20;
+constexpr unsigned int kTrianglesPerFace = 100;
+constexpr std::int64_t kItemsPerReference = kFacesPerMesh; // one polygon item per face
+
+/// One face's data: a band of two rows of points, 100 triangles between them.
+struct FaceData {
+    std::vector<float> vertices;
+    std::vector<float> normals;
+    std::vector<int> indices; ///< float offsets, three a triangle
+};
+
+FaceData MakeBand(float y) {
+    constexpr unsigned int columns = kTrianglesPerFace / 2 + 1;
+    FaceData band;
+    for (unsigned int row = 0; row < 2; ++row) {
+        for (unsigned int column = 0; column < columns; ++column) {
+            band.vertices.insert(band.vertices.end(),
+                                 {static_cast<float>(column), y + static_cast<float>(row), 0.0f});
+            band.normals.insert(band.normals.end(), {0.0f, 0.0f, 1.0f});
+        }
+    }
+    for (unsigned int column = 0; column + 1 < columns; ++column) {
+        int const low = static_cast<int>(column);
+        int const high = static_cast<int>(columns + column);
+        band.indices.insert(band.indices.end(), {3 * low, 3 * (low + 1), 3 * high});
+        band.indices.insert(band.indices.end(), {3 * (low + 1), 3 * (high + 1), 3 * high});
+    }
+    return band;
+}
+
+std::vector<FaceData> const& Bands() {
+    static std::vector<FaceData> const bands = [] {
+        std::vector<FaceData> made;
+        for (unsigned int face = 0; face < kFacesPerMesh; ++face)
+            made.push_back(MakeBand(static_cast<float>(2 * face)));
+        return made;
+    }();
+    return bands;
+}
+
+/// The tessellated geometry of reference `id`: one mesh of 2 000 triangles. Owned by the
+/// caller, who hands it to a structure.
+VizBridgeTarvex::VizContainer* MakeGeometry(int id) {
+    auto mesh = std::make_unique<KolbaVizCore::VizMesh>();
+    mesh->setID(1);
+    mesh->SetFaceCountHint(kFacesPerMesh);
+    for (FaceData const& band : Bands()) {
+        auto face = std::make_unique<KolbaVizCore::VizFace>();
+        face->SetVertices(static_cast<unsigned int>(band.vertices.size()), band.vertices.data());
+        face->SetNormals(static_cast<unsigned int>(band.normals.size()), band.normals.data());
+        auto polygon = std::make_unique<KolbaVizCore::VizPolygon>();
+        polygon->SetIndices(static_cast<unsigned int>(band.indices.size()), band.indices.data());
+        polygon->SetPolygonType(KolbaVizCore::Triangles);
+        face->AddPolygon(polygon.release()); // the face takes the polygon over
+        mesh->AddFace(face.release());       // the mesh takes the face over
+    }
+    auto container = std::make_unique<VizBridgeTarvex::VizContainer>(id);
+    container->AddMesh(mesh.release()); // the container takes the mesh over
+    return container.release();
+}
+
+VizPort::WString Name(char const* stem, unsigned int number, unsigned int copy) {
+    return VizPort::Widen(stem + std::to_string(number) + "." + std::to_string(copy));
+}
+
+/// `instances` root instances over the 1 000 references, each reference with its geometry.
+std::unique_ptr<VizProductStructure> MakeProduct(unsigned int instances) {
+    TarvexModel model;
+    model.SetProductName(u"RenderBench");
+    model.SetUnits(TarvexLengthUnit_Millimeter);
+    for (unsigned int reference = 1; reference <= kReferences; ++reference)
+        model.AddPart(reference, VizPort::Widen("Part" + std::to_string(reference)));
+    for (unsigned int instance = 0; instance < instances; ++instance) {
+        unsigned int const reference = instance % kReferences + 1;
+        TarvexPlacement placement;
+        placement.translation[0] = 100.0 * (instance % kReferences);
+        placement.translation[1] = 100.0 * (instance / kReferences);
+        model.AddRootInstance(reference, Name("Part", reference, instance / kReferences + 1))
+            .placement = placement;
+    }
+
+    TarvexPSImportResult const result = model.GetImportResult();
+    TarvexInputProductStructure const input = model.GetInputProductStructure();
+    TarvexDocument document = model.GetDocument();
+    VizProductStructure* raw = nullptr;
+    VizBuilder::MakeVizProductStructure(result, input, document, raw);
+    std::unique_ptr<VizProductStructure> structure(raw); // the host owns it
+    for (unsigned int reference = 1; reference <= kReferences; ++reference) {
+        int const id = static_cast<int>(reference);
+        VizProductStructureTestPeer::addVizContainer(*structure, id, MakeGeometry(id));
+    }
+    return structure;
+}
+
+/// A builder with the default item factory and no view.
+std::unique_ptr<SceneBuilder> MakeScene() {
+    auto builder = std::make_unique<SceneBuilder>();
+    builder->SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
+    return builder;
+}
+
+std::unique_ptr<TarvexRenderer> MakeRenderer(VizProductStructure& structure,
+                                             SceneBuilder& builder) {
+    // The caller owns the new renderer.
+    return std::unique_ptr<TarvexRenderer>(
+        TarvexRenderer::MakeRenderer(&structure, nullptr, &builder, 0.0, 0.0, 0.0));
+}
+
+struct SceneCount {
+    std::int64_t items = 0;      ///< owned by the nodes
+    std::int64_t itemsShown = 0; ///< owned, and shown again through references
+};
+
+void CountOwned(Node const& node, SceneCount& count) {
+    count.items += static_cast<std::int64_t>(node.GetItemCount());
+    for (std::size_t child = 0; child < node.GetChildCount(); ++child)
+        CountOwned(*node.GetChild(child), count);
+}
+
+std::int64_t CountShown(Node const& node) {
+    std::int64_t shown = static_cast<std::int64_t>(node.GetItemCount());
+    for (std::size_t child = 0; child < node.GetChildCount(); ++child)
+        shown += CountShown(*node.GetChild(child));
+    for (std::size_t reference = 0; reference < node.GetReferenceCount(); ++reference)
+        shown += CountShown(*node.GetReference(reference));
+    return shown;
+}
+
+SceneCount CountScene(SceneBuilder const& builder) {
+    SceneCount count;
+    for (std::size_t scene = 0; scene < builder.GetSceneCount(); ++scene) {
+        CountOwned(*builder.GetScene(scene), count);
+        count.itemsShown += CountShown(*builder.GetScene(scene));
+    }
+    return count;
+}
+
+/// Heap growth of rendering every reference once into an empty scene; 0 if that render
+/// failed.
+std::int64_t OneInstanceEachGrowth() {
+    static std::int64_t const growth = [] {
+        std::unique_ptr<VizProductStructure> const structure = MakeProduct(kReferences);
+        std::unique_ptr<SceneBuilder> const builder = MakeScene();
+        std::unique_ptr<TarvexRenderer> const renderer = MakeRenderer(*structure, *builder);
+        std::int64_t const before = LiveBytes();
+        bool const rendered = renderer->Render();
+        std::int64_t const grown = LiveBytes() - before;
+        return rendered && CountScene(*builder).items == kReferences * kItemsPerReference
+                   ? grown
+                   : std::int64_t{0};
+    }();
+    return growth;
+}
+
+void BM_Render(benchmark::State& state) {
+    auto const instances = static_cast<unsigned int>(state.range(0));
+    std::int64_t const baseline = OneInstanceEachGrowth();
+    if (baseline == 0) {
+        state.SkipWithError("rendering one instance of each reference failed");
+        return;
+    }
+    std::unique_ptr<VizProductStructure> const structure = MakeProduct(instances);
+    std::unique_ptr<SceneBuilder> const builder = MakeScene();
+    std::unique_ptr<TarvexRenderer> const renderer = MakeRenderer(*structure, *builder);
+
+    std::int64_t growth = 0;
+    SceneCount count;
+    std::int64_t nodes = 0;
+    bool rendered = true;
+    for (auto _ : state) {
+        std::int64_t const before = LiveBytes();
+        rendered = renderer->Render() && rendered;
+        state.PauseTiming();
+        if (nodes == 0) {
+            growth = LiveBytes() - before;
+            count = CountScene(*builder);
+            nodes = static_cast<std::int64_t>(builder->GetNodeCount());
+        }
+        renderer->ClearAll();
+        state.ResumeTiming();
+    }
+
+    if (!rendered) {
+        state.SkipWithError("a render failed");
+        return;
+    }
+    if (count.items != kReferences * kItemsPerReference ||
+        count.itemsShown != std::int64_t{instances} * kItemsPerReference) {
+        state.SkipWithError("the scene does not draw each reference once and show it per instance");
+        return;
+    }
+    auto const instanceCount = static_cast<double>(instances);
+    auto const furtherInstances = static_cast<double>(instances - kReferences);
+    double const furtherBytes = static_cast<double>(growth - baseline) / furtherInstances;
+    using benchmark::Counter;
+    state.counters["instances_per_second"] =
+        Counter(instanceCount, Counter::kIsIterationInvariantRate);
+    state.counters["items_per_second"] =
+        Counter(static_cast<double>(count.items), Counter::kIsIterationInvariantRate);
+    state.counters["items"] = static_cast<double>(count.items);
+    state.counters["items_shown"] = static_cast<double>(count.itemsShown);
+    state.counters["nodes"] = static_cast<double>(nodes);
+    state.counters["bytes_per_instance"] = static_cast<double>(growth) / instanceCount;
+    state.counters["bytes_per_further_instance"] = furtherBytes;
+    state.counters["drawing_bytes_per_reference"] =
+        (static_cast<double>(baseline) - kReferences * furtherBytes) / kReferences;
+}
+
+BENCHMARK(BM_Render)->Arg(10000)->Arg(100000)->Unit(benchmark::kMillisecond)->MinTime(2.0);
+
+} // namespace
+
+BENCHMARK_MAIN();
