@@ -1,0 +1,28 @@
+#pragma once
+
+#include "contracts/kolba/RGBAColor.h"
+#include "contracts/tarvex/TarvexVisuAttributes.h"
+#include "contracts/tarvex/TarvexVisuEdge.h"
+#include "contracts/tarvex/TarvexVisuFace.h"
+#include "contracts/tarvex/TarvexVisuPoints.h"
+#include "contracts/tarvex/TarvexVisuText.h"
+
+#include <vector>
+
+namespace VizBridgeTarvex {
+
+/// The colour an element of `source` should carry. Colour and alpha are looked for
+/// independently: each first on the source, then, when `inherit` is true and `attributes` is
+/// not null, on the stack from its newest entry to its oldest. Whatever is not found keeps the
+/// bytes of a default RGBAColor. Answers whether colour or alpha was found; only then is
+/// `color` written. Each 16-bit channel enters by its low 8 bits.
+bool resolveVisuColor(TarvexVisuEdge const& source, std::vector<TarvexVisuAttributes>* attributes,
+                      KolbaVizCore::RGBAColor& color, bool inherit);
+bool resolveVisuColor(TarvexVisuFace const& source, std::vector<TarvexVisuAttributes>* attributes,
+                      KolbaVizCore::RGBAColor& color, bool inherit);
+bool resolveVisuColor(TarvexVisuPoints const& source, std::vector<TarvexVisuAttributes>* attributes,
+                      KolbaVizCore::RGBAColor& color, bool inherit);
+bool resolveVisuColor(TarvexVisuText const& source, std::vector<TarvexVisuAttributes>* attributes,
+                      KolbaVizCore::RGBAColor& color, bool inherit);
+
+} // namespace VizBridgeTarvex
