@@ -1,4 +1,5 @@
 #include "import/VizBuilder.h"
+#include "import/TarvexTexts.h"
 
 #include "contracts/kolba/AllowThrow.h"
 #include "contracts/platform/WString.h"
@@ -23,21 +24,6 @@ namespace VizBridgeTarvex {
 using namespace BuilderErrors;
 
 namespace {
-/// The text of `text`, or nothing when the import library gives none.
-bool textOf(TarvexWString const& text, WString& out) {
-    char16_t const* characters = nullptr;
-    text.ToWChar(characters);
-    if (!characters)
-        return false;
-    out = characters;
-    return true;
-}
-
-WString textOrEmpty(TarvexWString const& text) {
-    WString out;
-    textOf(text, out);
-    return out;
-}
 
 /// Records a failure while building the instance tree: the plain text on the debug output,
 /// the formatted one appended under `id`. Returns the stored text.

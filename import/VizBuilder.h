@@ -1,10 +1,12 @@
 #pragma once
 
+#include "contracts/tarvex/TarvexVisuNode.h"
 #include "model/SemanticPMIMaps.h"
 #include "model/VizDocumentInfo.h"
 #include "model/VizTypes.h"
 
 #include <map>
+#include <memory>
 #include <vector>
 
 class TarvexDocument;
@@ -14,10 +16,13 @@ class TarvexInputPSReference;
 class TarvexPMIData;
 class TarvexPolicy;
 class TarvexPSImportResult;
+class TarvexVisuAttributes;
+class TarvexVisualizationData;
 
 namespace VizBridgeTarvex {
 
 class SemanticPMIBatch;
+class VisuIdMapJournal;
 class VizModelerServices;
 class VizPartContainer;
 class VizProductStructure;
@@ -110,6 +115,25 @@ private:
     VizPartContainer* getVizPartContainerFromReference(TarvexInputPSReference const& reference,
                                                        TarvexEntity entity, WString& path);
     void importVisuDataFromReference(TarvexInputPSReference const& reference);
+    /// Makes the containers that m_importVisu / m_importPMI ask for and fills them from
+    /// `data`. Both out-arguments come in null; a container handed out is the caller's.
+    /// When a throw ends the walk, the containers are freed and every visual id the walk
+    /// entered is put back as it was.
+    void importGraphicalContainer(int const& referenceId, TarvexVisualizationData const& data,
+                                  VizContainer*& vizContainer, VizPMIContainer*& pmiContainer);
+    /// Loads one leaf into the list its type and geometry type choose; `journal` takes the
+    /// visual ids it enters.
+    void processVizLeaf(VizContainer* vizContainer, VizPMIContainer* pmiContainer,
+                        TarvexVisuNode const& node, std::vector<TarvexVisuAttributes>& attributes,
+                        TarvexVisuNode::TarvexVisuNodeType const& nodeType,
+                        VisuIdMapJournal& journal);
+    /// The element entered under `visualId`, or null; the lookup adds nothing.
+    VizElement* GetVizElement(WString const& visualId) const;
+    /// The mechanical id of the mesh, face, edge or PMI entered under `visualId`; empty
+    /// for anything else.
+    WString GetVizElementMechID(WString const& visualId) const;
+    /// Gives each PMI of `container` the mechanical ids of its linked elements.
+    void FillVizPMIMechIDs(VizPMIContainer* container) const;
     void processSemanticPMI(TarvexPMIData& data, SemanticPMIByReference& semanticPMI);
     /// Gives every inner map's records to the structure and frees the inner maps.
     void handOverSemanticPMI(SemanticPMIBatch& batch);
@@ -131,6 +155,9 @@ private:
     double m_totalImportGeomTime = 0.0;
     int m_numberOfProcessorsUsed = 1;
     std::map<WString, VizElement*> m_visuIdMap; ///< elements not owned
+    /// Elements that a leaf loaded but that stand in no container: the first load of a
+    /// constructed geometry for FTA. Kept as long as m_visuIdMap may point into them.
+    std::vector<std::unique_ptr<VizElement>> m_unlistedElements;
 };
 
 } // namespace VizBridgeTarvex

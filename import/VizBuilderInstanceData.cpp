@@ -17,6 +17,7 @@
 #include "contracts/tarvex/TarvexPartImportResult.h"
 #include "import/BuilderErrors.h"
 #include "import/SemanticPMIBatch.h"
+#include "import/TarvexTexts.h"
 #include "import/VizBuilder.h"
 #include "model/VizProductStructure.h"
 #include "services/VizModelerServices.h"
@@ -28,12 +29,6 @@ namespace VizBridgeTarvex {
 using namespace BuilderErrors;
 
 namespace {
-WString textOf(TarvexWString const& text) {
-    char16_t const* characters = nullptr;
-    text.ToWChar(characters);
-    return characters ? WString(characters) : WString();
-}
-
 /// Stops `stopwatch` if it still runs and adds what it measured to `total`.
 void stopInto(KolbaVizCore::Stopwatch& stopwatch, double& total) {
     if (!stopwatch.IsRunning())
@@ -93,7 +88,7 @@ void VizBuilder::importContainersFromTarvex_MultiProc(int const& total) {
                 continue;
             if (m_progressCallback) {
                 ++progress;
-                WString const text = brepProgressText(textOf(reference.GetReferenceName()));
+                WString const text = brepProgressText(textOrEmpty(reference.GetReferenceName()));
                 reportProgress(progress, total, &text);
             }
             importBREPFromReference(reference, semanticPMI.map());
@@ -129,7 +124,7 @@ void VizBuilder::defineReference(TarvexInputPSReference const& reference, int* c
 void VizBuilder::defineReference(TarvexInputPSReference const& reference, int* counter,
                                  std::vector<int>& ancestors) {
     int const id = static_cast<int>(reference.GetUniqueID());
-    WString const name = textOf(reference.GetReferenceName());
+    WString const name = textOrEmpty(reference.GetReferenceName());
     int const current = counter ? *counter + 1 : 0;
     int const total = m_productStructure.GetContainerCount();
 
@@ -199,7 +194,7 @@ void VizBuilder::importBREPFromReference(TarvexInputPSReference const& reference
     try {
         // Read inside the guard: a reference that cannot even be read costs only itself.
         id = static_cast<int>(reference.GetUniqueID());
-        WString const name = textOf(reference.GetReferenceName());
+        WString const name = textOrEmpty(reference.GetReferenceName());
         TarvexPartDocument document = reference.GetDocument();
         TarvexPartImportResult result;
         VizPartContainer* container = nullptr;
@@ -246,15 +241,11 @@ VizBuilder::getVizPartContainerFromReference(TarvexInputPSReference const& refer
     if (!entity.GetInstanceEntity(instanceEntity))
         return nullptr;
     TarvexInputPSInstance const instance = instanceEntity.GetInstance();
-    WString const instanceName = textOf(instance.GetInstanceName());
+    WString const instanceName = textOrEmpty(instance.GetInstanceName());
     path = path.empty() ? instanceName : path + u"/" + instanceName;
     return getVizPartContainerFromReference(instance.GetReference(), instanceEntity.GetEntity(),
                                             path);
 }
-
-// Visualisation data arrives with the visualisation importer; until then a reference has
-// none to import.
-void VizBuilder::importVisuDataFromReference(TarvexInputPSReference const& /*reference*/) {}
 
 // Semantic PMI arrives with the PMI objects of the import library; until then a part has
 // none to add.
