@@ -1,6 +1,7 @@
 #include "contracts/kolba/VizMesh.h"
 #include "contracts/kolba/VizPMI.h"
 #include "contracts/kolba/VizPointSet.h"
+#include "contracts/kolba/VizText.h"
 #include "contracts/kolba/VizWire.h"
 #include "contracts/tarvex/TarvexModel.h"
 #include "import/VizBuilder.h"
@@ -72,8 +73,9 @@ struct VisuImport {
         model.AddRootInstance(kCover, u"Cover.1");
     }
     TarvexAuthoredVisuData& visu(unsigned int id) { return model.FindReference(id)->visu; }
-    void run(bool importVisu, bool importPMI) {
+    void run(bool importVisu, bool importPMI, bool tesselateText = false) {
         structure = buildStructure(model);
+        structure->SetTesselatingText(tesselateText);
         input = model.GetInputProductStructure();
         VizBuilder builder(*structure, input, nullptr);
         builder.SetImportVisu(importVisu);
@@ -170,6 +172,33 @@ TEST(VisuDataImport, PMILinksResolveToMechanicalIdsAfterTheWholeWalk) {
         std::vector<std::u16string> const got = pmis[0]->GetLinkedEntityMechIDs();
         EXPECT_EQ(got, c.mechanicalIds);
         EXPECT_TRUE(pmis[1]->GetLinkedEntityMechIDs().empty()) << "no links: an empty list";
+    }
+}
+
+TEST(VisuDataImport, TheStructuresTextSwitchKeepsTextsOrTessellatesThem) {
+    for (bool const tesselate : {false, true}) {
+        SCOPED_TRACE(tesselate);
+        VisuImport v;
+        TarvexAuthoredVisuNode note = pmiNode(u"n1");
+        TarvexAuthoredVisuText text;
+        text.text = u"AB";
+        text.font = TarvexAuthoredVisuFont{u"DejaVu Sans", 5.0f, 1.0f, 1.0f};
+        note.pmi.texts.push_back(text);
+        v.visu(kBracket).nodes = {note};
+        v.run(true, true, tesselate);
+
+        auto const& pmis = v.structure->GetVizPMIContainer(kBracket)->GetVizPMIs();
+        ASSERT_EQ(pmis.size(), 1u);
+        if (tesselate) {
+            EXPECT_TRUE(pmis[0]->GetTexts().empty());
+            EXPECT_GT(pmis[0]->GetEdges().size(), 1u) << "the leader, then the glyph outlines";
+            EXPECT_EQ(pmis[0]->GetFaces().size(), 2u) << "one filled glyph per letter";
+        } else {
+            ASSERT_EQ(pmis[0]->GetTexts().size(), 1u);
+            EXPECT_EQ(pmis[0]->GetTexts()[0]->GetText(), u"AB");
+            EXPECT_EQ(pmis[0]->GetEdges().size(), 1u);
+            EXPECT_TRUE(pmis[0]->GetFaces().empty());
+        }
     }
 }
 
