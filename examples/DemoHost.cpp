@@ -1,6 +1,7 @@
 // vizbridge_demo: a host that imports the bundled sample assembly and prints what VizBridge
 // made of it. Each step of the road is one function below.
 
+#include "examples/ContainerReport.h"
 #include "examples/SampleAssembly.h"
 
 #include "contracts/kolba/DefaultGeometryItemFactory.h"
@@ -79,6 +80,17 @@ ImportTimes ImportData(VizProductStructure& structure, TarvexInputProductStructu
             builder.GetTotalImportSemanticPMITime(), builder.GetNumberOfProcessorsUsed()};
 }
 
+/// Step 2, the other road: the parts' tessellated data and graphical PMI instead of their
+/// BREP. Each part that has such data gets a VizContainer of meshes, wires and point sets and
+/// a VizPMIContainer of PMI, views and captures. No modeler is needed.
+void ImportVisualisation(VizProductStructure& structure, TarvexInputProductStructure const& input) {
+    VizBuilder builder(structure, input, nullptr);
+    builder.SetImportVisu(true);
+    builder.SetImportPMI(true);
+    builder.SetProgressCallback(&PrintProgress);
+    builder.ImportAndBuildPS();
+}
+
 void PrintTree(VizProductStructure const& structure) {
     std::cout << Narrow(structure.ToString()) << '\n';
 }
@@ -127,9 +139,10 @@ void PrintRenderProgress(int const& done, int const& total, char const* phase) {
 }
 
 /// Step 4: a renderer draws the structure into the host's scene. The host keeps the scene
-/// builder, the view and the modeler alive for as long as the renderer lives; deleting the
-/// renderer removes what it drew.
-void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModelerServices& modeler) {
+/// builder, the view and the modeler (if any) alive for as long as the renderer lives;
+/// deleting the renderer removes what it drew. `printScene`: print the whole scene tree.
+void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModelerServices* modeler,
+                     bool printScene) {
     KolbaVizCore::RecordingView3D view;
     KolbaVizCore::SceneBuilder scene;
     KolbaVizCore::View3DAdapter adapter(&view, &scene);
@@ -137,18 +150,21 @@ void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModeler
     scene.SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
 
     std::unique_ptr<VizBridgeTarvex::TarvexRenderer> renderer(
-        VizBridgeTarvex::TarvexRenderer::MakeRenderer(&structure, &modeler, &scene, 0.0, 0.0, 0.0));
+        VizBridgeTarvex::TarvexRenderer::MakeRenderer(&structure, modeler, &scene, 0.0, 0.0, 0.0));
     renderer->SetProgressCallback(&PrintRenderProgress);
     bool const rendered = renderer->Render();
     std::cout << "Rendered: " << (rendered ? "yes" : "no") << ", " << scene.GetNodeCount()
-              << " nodes\n"
-              << scene.Dump();
+              << " nodes\n";
+    if (printScene)
+        std::cout << scene.Dump();
     for (auto const& sphere : view.GetExtentSpheres())
         std::cout << "Extents: centre (" << sphere.center[0] << ", " << sphere.center[1] << ", "
                   << sphere.center[2] << "), radius " << sphere.radius << '\n';
 
     renderer->ClearAll();
-    std::cout << "After ClearAll: " << scene.GetNodeCount() << " node(s)\n" << scene.Dump();
+    std::cout << "After ClearAll: " << scene.GetNodeCount() << " node(s)\n";
+    if (printScene)
+        std::cout << scene.Dump();
     renderer.reset(); // before the scene it drew into
 }
 
@@ -173,9 +189,44 @@ void RunRoad(VizBridgeExamples::SampleAssembly const& sample, int processors) {
     PrintFailures(*structure);
     PrintTimes(times);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, modeler);
+    RenderStructure(*structure, &modeler, true);
 
     // The structure goes last: after the builder and every renderer made on it.
+    structure.reset();
+}
+
+/// What the visualisation import made of each part of the sample.
+void PrintContainers(VizProductStructure const& structure) {
+    using Sample = VizBridgeExamples::SampleAssembly;
+    struct Part {
+        char const* name;
+        unsigned int id;
+    };
+    for (Part const part : {Part{"Bracket", Sample::kBracketId}, Part{"Bolt", Sample::kBoltId},
+                            Part{"Cover", Sample::kCoverId}}) {
+        int const id = static_cast<int>(part.id);
+        std::cout << part.name << " (reference " << id << "), "
+                  << (structure.IsVizLoaded(id) ? "loaded" : "not loaded") << '\n';
+        if (VizBridgeTarvex::VizContainer const* const container = structure.GetVizContainer(id))
+            VizBridgeExamples::PrintVizContainer(std::cout, *container);
+        if (VizBridgeTarvex::VizPMIContainer const* const pmi = structure.GetVizPMIContainer(id))
+            VizBridgeExamples::PrintVizPMIContainer(std::cout, *pmi);
+    }
+}
+
+/// The road with tessellated data: import the parts' visualisation data and PMI, print the
+/// containers, render them. `tesselateText`: PMI texts become strokes and filled glyphs.
+void RunVisualisationRoad(VizBridgeExamples::SampleAssembly const& sample, bool tesselateText) {
+    TarvexMultiProcess::SetNumberOfProcessorsToUse(1);
+    TarvexInputProductStructure const input = sample.GetModel().GetInputProductStructure();
+    std::unique_ptr<VizProductStructure> structure = MakeStructure(sample.GetModel(), input);
+    structure->SetTesselatingText(tesselateText); // read by the import, leaf by leaf
+    std::cout << "Importing visualisation data and PMI\n";
+    ImportVisualisation(*structure, input);
+    PrintContainers(*structure);
+    PrintFailures(*structure);
+    std::cout << "Rendering\n";
+    RenderStructure(*structure, nullptr, false);
     structure.reset();
 }
 
@@ -187,6 +238,10 @@ int main() {
         RunRoad(sample, 1);
         std::cout << "\n=== Import through the multi-process spooler\n";
         RunRoad(sample, 0);
+        std::cout << "\n=== Visualisation data and PMI, texts kept as texts\n";
+        RunVisualisationRoad(sample, false);
+        std::cout << "\n=== Visualisation data and PMI, texts tessellated\n";
+        RunVisualisationRoad(sample, true);
         return 0;
     } catch (std::exception const& e) {
         std::cerr << "vizbridge_demo: " << e.what() << '\n';

@@ -8,6 +8,9 @@ namespace VizBridgeExamples {
 /// demo host runs without any CAD file. Owns its model; the value objects that the model
 /// hands out share its data and may outlive this object.
 ///
+/// The Bracket and the Bolt carry both a BREP and tessellated visualisation data with PMI;
+/// the Cover only a BREP, and its file is missing.
+///
 ///     SampleProduct (unit mm)
 ///     +- BracketAssembly.1   sub-assembly "BracketAssembly"      id 10
 ///     |  +- Bracket.1        part "Bracket", red                  id 11
