@@ -3,11 +3,17 @@
 #include "contracts/kolba/VizPointSet.h"
 #include "contracts/kolba/VizText.h"
 #include "contracts/kolba/VizWire.h"
+#include "contracts/tarvex/TarvexInputPSReference.h"
 #include "contracts/tarvex/TarvexModel.h"
+#include "contracts/tarvex/TarvexPartDocument.h"
+#include "contracts/tarvex/TarvexVisuData.h"
+#include "contracts/tarvex/TarvexVisuImportResult.h"
+#include "contracts/tarvex/TarvexVisualizationImporter.h"
 #include "import/VizBuilder.h"
 #include "model/VizProductStructure.h"
 #include "support/BuildStructure.h"
 #include "support/DebugCapture.h"
+#include "support/VizBuilderTestPeer.h"
 
 #include <gtest/gtest.h>
 
@@ -200,6 +206,47 @@ TEST(VisuDataImport, TheStructuresTextSwitchKeepsTextsOrTessellatesThem) {
             EXPECT_TRUE(pmis[0]->GetFaces().empty());
         }
     }
+}
+
+// The roads that import PMI without tessellated geometry call these steps directly.
+TEST(VisuDataImport, WithPMIAloneOnlyPMIAndTheirConstructedGeometryAreLoaded) {
+    VisuImport v;
+    v.visu(kBracket).nodes = {meshNode(u"m1", TarvexVisuGeometry_Standard),
+                              meshNode(u"m2", TarvexVisuGeometry_Constructed),
+                              meshNode(u"m3", TarvexVisuGeometry_FTAConstructed), pmiNode(u"n1")};
+    v.structure = buildStructure(v.model);
+    v.input = v.model.GetInputProductStructure();
+    VizBuilder builder(*v.structure, v.input, nullptr);
+    builder.SetImportPMI(true);
+    TarvexPartDocument const document = v.input.GetReferenceFromId(kBracket).GetDocument();
+    TarvexVisuData const data =
+        TarvexVisualizationImporter().Import(document).GetVisualizationData();
+
+    VizContainer* viz = nullptr;
+    VizPMIContainer* pmi = nullptr;
+    VizBuilderTestPeer::graphicalContainer(builder, kBracket, data, viz, pmi);
+    std::unique_ptr<VizPMIContainer> const owned(pmi);
+    EXPECT_EQ(viz, nullptr);
+    ASSERT_NE(pmi, nullptr);
+    ASSERT_EQ(pmi->GetVizFTACGMeshes().size(), 1u);
+    EXPECT_EQ(pmi->GetVizFTACGMeshes()[0]->GetVisualID(), u"m3");
+    EXPECT_EQ(pmi->GetVizPMIs().size(), 1u);
+    EXPECT_EQ(VizBuilderTestPeer::element(builder, u"n1"), pmi->GetVizPMIs()[0]);
+    for (char16_t const* id : {u"m1/f", u"m3/f"})
+        EXPECT_EQ(VizBuilderTestPeer::element(builder, id), nullptr) << "no mesh ids without a "
+                                                                        "VizContainer";
+}
+
+TEST(VisuDataImport, WithNeitherSwitchNothingIsFiledAndTheReferenceIsNamed) {
+    VisuImport v;
+    v.visu(kBracket).nodes = {meshNode(u"m1", TarvexVisuGeometry_Standard)};
+    v.structure = buildStructure(v.model);
+    v.input = v.model.GetInputProductStructure();
+    VizBuilder builder(*v.structure, v.input, nullptr);
+    VizBuilderTestPeer::importVisuData(builder, v.input.GetReferenceFromId(kBracket));
+    EXPECT_FALSE(v.structure->IsVizLoaded(kBracket));
+    EXPECT_EQ(v.structure->GetErrorMessages(),
+              (std::vector<std::u16string>{u"Could not Import VisuData from Bracket"}));
 }
 
 TEST(VisuDataImport, AnImportFailureIsStoredAndTheNextReferenceIsImported) {
