@@ -1,3 +1,4 @@
+#include "contracts/kolba/VizFace.h"
 #include "contracts/kolba/VizMesh.h"
 #include "contracts/kolba/VizPMI.h"
 #include "contracts/kolba/VizPointSet.h"
@@ -159,6 +160,28 @@ TEST(VisuDataImport, TheNodesOwnAttributesReachItsTopElement) {
     EXPECT_EQ(meshes[1]->GetColor(), RGBAColor(10, 20, 0x30, 255));
     EXPECT_TRUE(meshes[1]->GetHidden());
     EXPECT_FALSE(meshes[2]->HasColor()) << "no attributes of its own: the loader's colour stays";
+}
+
+// Faces look up the stack for their colour, so they show which attributes it holds.
+TEST(VisuDataImport, AGroupsAttributesStayForTheRestOfTheWalkALeafsOnlyForItself) {
+    VisuImport v;
+    TarvexAuthoredVisuNode group;
+    group.type = Node::VisuGroup;
+    group.leaf = false;
+    group.attributes.rgb = std::array<unsigned short, 3>{200, 0, 0};
+    TarvexAuthoredVisuNode notALeaf = meshNode(u"skipped", TarvexVisuGeometry_Standard);
+    notALeaf.leaf = false;
+    TarvexAuthoredVisuNode green = meshNode(u"m2", TarvexVisuGeometry_Standard);
+    green.attributes.rgb = std::array<unsigned short, 3>{0, 200, 0};
+    v.visu(kBracket).nodes = {group, meshNode(u"m1", TarvexVisuGeometry_Standard), green,
+                              meshNode(u"m3", TarvexVisuGeometry_Standard), notALeaf};
+    v.run(true, false);
+    auto const& meshes = v.structure->GetVizContainer(kBracket)->GetMeshes();
+    ASSERT_EQ(meshes.size(), 3u) << "a mesh node that is no leaf makes nothing";
+    RGBAColor const red(200, 0, 0, 255), greenColour(0, 200, 0, 255);
+    EXPECT_EQ(meshes[0]->GetFaces()[0]->GetColor(), red);
+    EXPECT_EQ(meshes[1]->GetFaces()[0]->GetColor(), greenColour);
+    EXPECT_EQ(meshes[2]->GetFaces()[0]->GetColor(), red) << "the leaf's colour left with it";
 }
 
 TEST(VisuDataImport, PMILinksResolveToMechanicalIdsAfterTheWholeWalk) {
