@@ -160,7 +160,11 @@ void TarvexRenderer::renderInstance(VizPSEntry& entry) {
         m_colorOverride = true;
     }
 
-    auto const addVisible = [&](VizBox const& box) {
+    // Draws one kind of content of the reference; a hidden instance adds nothing to the extents.
+    using PartRender = bool (TarvexRenderer::*)(int const&, VizTransf const&, VizBox&);
+    auto const draw = [&](PartRender render) {
+        VizBox box;
+        (this->*render)(id, transformation, box);
         if (visible)
             m_geometryBox.Add(box);
     };
@@ -172,29 +176,18 @@ void TarvexRenderer::renderInstance(VizPSEntry& entry) {
                        "RenderPart");
         if (m_colorOverride)
             builder->SetCurrentColor(m_overrideColor, true);
-        VizBox box;
         if (entry.GetVizPartContainer())
-            renderPartBREP(id, transformation, box);
+            draw(&TarvexRenderer::renderPartBREP);
         else if (entry.GetVizContainer())
-            renderPartGeometry(id, transformation, box);
-        addVisible(box);
-        if (entry.GetVizPMIContainer()) {
-            VizBox pmiBox;
-            renderPartPMI(id, transformation, pmiBox);
-            addVisible(pmiBox);
-        }
+            draw(&TarvexRenderer::renderPartGeometry);
+        if (entry.GetVizPMIContainer())
+            draw(&TarvexRenderer::renderPartPMI);
         builder->SetVisibility(visible);
     } else {
-        if (entry.GetVizContainer()) {
-            VizBox box;
-            renderPartGeometry(id, transformation, box);
-            addVisible(box);
-        }
-        if (entry.GetVizPMIContainer()) {
-            VizBox pmiBox;
-            renderPartPMI(id, transformation, pmiBox);
-            addVisible(pmiBox);
-        }
+        if (entry.GetVizContainer())
+            draw(&TarvexRenderer::renderPartGeometry);
+        if (entry.GetVizPMIContainer())
+            draw(&TarvexRenderer::renderPartPMI);
         builder->SetVisibility(visible);
         std::vector<VizPSEntry*> const children = entry.GetChildren();
         unsigned long counter = 0;
