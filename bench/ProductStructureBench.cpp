@@ -22,63 +22,18 @@
 #include "model/VizPSEntry.h"
 #include "model/VizProductStructure.h"
 
+#include "bench/support/LiveBytes.h"
+
 #include <benchmark/benchmark.h>
 
 #include <array>
-#include <atomic>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <memory>
-#include <new>
 #include <string>
 #include <vector>
 
-// Live bytes of the whole process, kept by the replaced global operator new and delete
-// below. Each block carries its size in a header that keeps the default new alignment.
-namespace {
-
-std::atomic<std::int64_t> g_liveBytes{0};
-constexpr std::size_t kHeader = __STDCPP_DEFAULT_NEW_ALIGNMENT__;
-
-void* CountedAllocate(std::size_t size) {
-    void* const block = std::malloc(size + kHeader);
-    if (block == nullptr)
-        throw std::bad_alloc();
-    *static_cast<std::size_t*>(block) = size;
-    g_liveBytes.fetch_add(static_cast<std::int64_t>(size), std::memory_order_relaxed);
-    return static_cast<std::byte*>(block) + kHeader;
-}
-
-void CountedFree(void* pointer) noexcept {
-    if (pointer == nullptr)
-        return;
-    void* const block = static_cast<std::byte*>(pointer) - kHeader;
-    g_liveBytes.fetch_sub(static_cast<std::int64_t>(*static_cast<std::size_t*>(block)),
-                          std::memory_order_relaxed);
-    std::free(block);
-}
-
-} // namespace
-
-void* operator new(std::size_t size) {
-    return CountedAllocate(size);
-}
-void* operator new[](std::size_t size) {
-    return CountedAllocate(size);
-}
-void operator delete(void* pointer) noexcept {
-    CountedFree(pointer);
-}
-void operator delete[](void* pointer) noexcept {
-    CountedFree(pointer);
-}
-void operator delete(void* pointer, std::size_t) noexcept {
-    CountedFree(pointer);
-}
-void operator delete[](void* pointer, std::size_t) noexcept {
-    CountedFree(pointer);
-}
+using VizBridgeBench::LiveBytes;
 
 namespace {
 
@@ -145,12 +100,12 @@ void BM_MakeVizProductStructure(benchmark::State& state) {
     std::int64_t retainedBytes = 0;
     std::int64_t entries = 0;
     for (auto _ : state) {
-        std::int64_t const before = g_liveBytes.load(std::memory_order_relaxed);
+        std::int64_t const before = LiveBytes();
         VizProductStructure* raw = nullptr;
         VizBuilder::MakeVizProductStructure(result, input, document, raw);
         // Ownership passes to the host with the pointer.
         std::unique_ptr<VizProductStructure> structure(raw);
-        retainedBytes = g_liveBytes.load(std::memory_order_relaxed) - before;
+        retainedBytes = LiveBytes() - before;
 
         if (entries == 0) {
             state.PauseTiming();
