@@ -24,18 +24,6 @@ namespace {
 
 using Peer = VizProductStructureTestPeer;
 
-struct Progress {
-    int done;
-    int total;
-    std::string phase;
-};
-std::vector<Progress>& progress() {
-    static std::vector<Progress> calls;
-    return calls;
-}
-void recordProgress(int const& done, int const& total, char const* phase) {
-    progress().push_back({done, total, phase});
-}
 /// Fails the walk at its first part, as a broken host callback would.
 void throwAtFirstPart(int const& done, int const& total, char const* phase) {
     recordProgress(done, total, phase);

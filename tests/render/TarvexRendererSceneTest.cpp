@@ -67,19 +67,6 @@ std::string withProductTag(std::string text, std::uint32_t tag) {
     return text;
 }
 
-struct Progress {
-    int done;
-    int total;
-    std::string phase;
-};
-std::vector<Progress>& progress() {
-    static std::vector<Progress> calls;
-    return calls;
-}
-void recordProgress(int const& done, int const& total, char const* phase) {
-    progress().push_back({done, total, phase});
-}
-
 /// A structure from `model`, rendered into `scene` by a renderer without services.
 struct Rendered {
     Rendered(TarvexModel const& model, RenderScene& scene)

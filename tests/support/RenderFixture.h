@@ -17,10 +17,26 @@
 #include <initializer_list>
 #include <memory>
 #include <string>
+#include <vector>
 
 namespace VizBridgeTarvex {
 
 /// A SceneBuilder with the default item factory and a view that records its extents.
+/// One call of the render's progress callback. The callback is a plain function pointer, so
+/// the calls go to one process-wide list that each test clears before it renders.
+struct Progress {
+    int done;
+    int total;
+    std::string phase;
+};
+inline std::vector<Progress>& progress() {
+    static std::vector<Progress> calls;
+    return calls;
+}
+inline void recordProgress(int const& done, int const& total, char const* phase) {
+    progress().push_back({done, total, phase});
+}
+
 struct RenderScene {
     RenderScene() : adapter(&view, &builder) {
         builder.SetView3DAdapter(&adapter);
