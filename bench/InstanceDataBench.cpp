@@ -6,14 +6,14 @@
 // Conversions are cached in the model, so each iteration authors a fresh one outside the
 // timed region. Wall-clock time is what a host waits for: the benchmarks use real time.
 
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexMultiProcess.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
-#include "import/VizBuilder.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
 
 #include <benchmark/benchmark.h>
 

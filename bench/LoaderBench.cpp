@@ -21,23 +21,23 @@
 //   BM_Memcpy          std::memcpy of the same number of bytes between two buffers that were
 //                      allocated and touched beforehand.
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexMultiProcess.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexVisuData.h"
-#include "contracts/tarvex/TarvexVisuImportResult.h"
-#include "contracts/tarvex/TarvexVisuMesh.h"
-#include "contracts/tarvex/TarvexVisuNodeIter.h"
-#include "contracts/tarvex/TarvexVisualizationImporter.h"
-#include "import/VizBuilder.h"
-#include "loaders/VizMeshLoader.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuMesh.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNodeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisualizationImporter.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/loaders/VizMeshLoader.h>
+#include <VizBridge/model/VizProductStructure.h>
 
 #include <benchmark/benchmark.h>
 

@@ -14,15 +14,15 @@
 //   bytes_per_entry   bytes that MakeVizProductStructure allocated and that were still
 //                     live when it returned, divided by the number of entries
 
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "import/VizBuilder.h"
-#include "model/VizPSEntry.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizProductStructure.h>
 
-#include "bench/support/LiveBytes.h"
+#include "support/LiveBytes.h"
 
 #include <benchmark/benchmark.h>
 

@@ -1,8 +1,8 @@
 // Speed and memory of TarvexRenderer::Render on a product of many instances of few references.
 //
-// The product: 1 000 part references (ids 1..1000), each with tessellated geometry - a
-// VizContainer holding one VizMesh of 20 faces, each face one polygon of 100 triangles, so
-// 2 000 triangles a reference - and N root instances (10 000 or 100 000) that place the
+// The product: 1 000 part references (ids 1..1000), each with tessellated geometry - one
+// mesh of 20 faces, each face one polygon of 100 triangles, so 2 000 triangles a reference,
+// imported as a host imports it - and N root instances (10 000 or 100 000) that place the
 // references in turn, each at a translation of its own. The renderer draws a reference
 // below its first instance; every further instance gets a node with its placement and a
 // node reference to that drawing.
@@ -27,24 +27,19 @@
 // measured once for the whole run. Heap bytes are those requested from operator new; the
 // allocator's own overhead is not counted.
 
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
-#include "contracts/kolba/Node.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "import/VizBuilder.h"
-#include "model/VizProductStructure.h"
-#include "render/TarvexRenderer.h"
-// The import phases fill a structure's containers from the import library; the benchmark
-// hands them over directly, as the tests do.
-#include "tests/support/VizProductStructureTestPeer.h"
-
-#include "bench/support/LiveBytes.h"
+#include "support/LiveBytes.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/Node.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/UniqueProductStructure.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/render/TarvexRenderer.h>
+#include <VizBridge/render/UniqueRenderer.h>
 
 #include <benchmark/benchmark.h>
 
@@ -63,23 +58,17 @@ using KolbaVizCore::SceneBuilder;
 using VizBridgeTarvex::TarvexRenderer;
 using VizBridgeTarvex::VizBuilder;
 using VizBridgeTarvex::VizProductStructure;
-using VizBridgeTarvex::VizProductStructureTestPeer;
 
 constexpr unsigned int kReferences = 1000;
 constexpr unsigned int kFacesPerMesh = 20;
 constexpr unsigned int kTrianglesPerFace = 100;
 constexpr std::int64_t kItemsPerReference = kFacesPerMesh; // one polygon item per face
 
-/// One face's data: a band of two rows of points, 100 triangles between them.
-struct FaceData {
-    std::vector<float> vertices;
-    std::vector<float> normals;
-    std::vector<int> indices; ///< float offsets, three a triangle
-};
-
-FaceData MakeBand(float y) {
+/// One face: a band of two rows of points, 100 triangles between them. Indices are float
+/// offsets, three a triangle.
+TarvexAuthoredVisuFace MakeBand(float y) {
     constexpr unsigned int columns = kTrianglesPerFace / 2 + 1;
-    FaceData band;
+    TarvexAuthoredVisuFace band;
     for (unsigned int row = 0; row < 2; ++row) {
         for (unsigned int column = 0; column < columns; ++column) {
             band.vertices.insert(band.vertices.end(),
@@ -87,57 +76,45 @@ FaceData MakeBand(float y) {
             band.normals.insert(band.normals.end(), {0.0f, 0.0f, 1.0f});
         }
     }
+    std::vector<int> indices;
     for (unsigned int column = 0; column + 1 < columns; ++column) {
         int const low = static_cast<int>(column);
         int const high = static_cast<int>(columns + column);
-        band.indices.insert(band.indices.end(), {3 * low, 3 * (low + 1), 3 * high});
-        band.indices.insert(band.indices.end(), {3 * (low + 1), 3 * (high + 1), 3 * high});
+        indices.insert(indices.end(), {3 * low, 3 * (low + 1), 3 * high});
+        indices.insert(indices.end(), {3 * (low + 1), 3 * (high + 1), 3 * high});
     }
+    band.polygons.push_back(
+        TarvexAuthoredVisuPolygon{std::move(indices), TarvexVisuPolygon_Triangles});
     return band;
 }
 
-std::vector<FaceData> const& Bands() {
-    static std::vector<FaceData> const bands = [] {
-        std::vector<FaceData> made;
+/// The tessellated geometry of every reference: one mesh of 2 000 triangles.
+TarvexAuthoredVisuData const& Geometry() {
+    static TarvexAuthoredVisuData const data = [] {
+        TarvexAuthoredVisuData made;
+        made.unit = TarvexLengthUnit_Millimeter;
+        TarvexAuthoredVisuNode& mesh = made.nodes.emplace_back();
+        mesh.type = TarvexVisuNode::VisuMesh;
         for (unsigned int face = 0; face < kFacesPerMesh; ++face)
-            made.push_back(MakeBand(static_cast<float>(2 * face)));
+            mesh.mesh.faces.push_back(MakeBand(static_cast<float>(2 * face)));
         return made;
     }();
-    return bands;
-}
-
-/// The tessellated geometry of reference `id`: one mesh of 2 000 triangles. Owned by the
-/// caller, who hands it to a structure.
-VizBridgeTarvex::VizContainer* MakeGeometry(int id) {
-    auto mesh = std::make_unique<KolbaVizCore::VizMesh>();
-    mesh->setID(1);
-    mesh->SetFaceCountHint(kFacesPerMesh);
-    for (FaceData const& band : Bands()) {
-        auto face = std::make_unique<KolbaVizCore::VizFace>();
-        face->SetVertices(static_cast<unsigned int>(band.vertices.size()), band.vertices.data());
-        face->SetNormals(static_cast<unsigned int>(band.normals.size()), band.normals.data());
-        auto polygon = std::make_unique<KolbaVizCore::VizPolygon>();
-        polygon->SetIndices(static_cast<unsigned int>(band.indices.size()), band.indices.data());
-        polygon->SetPolygonType(KolbaVizCore::Triangles);
-        face->AddPolygon(polygon.release()); // the face takes the polygon over
-        mesh->AddFace(face.release());       // the mesh takes the face over
-    }
-    auto container = std::make_unique<VizBridgeTarvex::VizContainer>(id);
-    container->AddMesh(mesh.release()); // the container takes the mesh over
-    return container.release();
+    return data;
 }
 
 VizPort::WString Name(char const* stem, unsigned int number, unsigned int copy) {
     return VizPort::Widen(stem + std::to_string(number) + "." + std::to_string(copy));
 }
 
-/// `instances` root instances over the 1 000 references, each reference with its geometry.
+/// `instances` root instances over the 1 000 references, each reference's geometry imported
+/// the way a host imports tessellated data.
 std::unique_ptr<VizProductStructure> MakeProduct(unsigned int instances) {
     TarvexModel model;
     model.SetProductName(u"RenderBench");
     model.SetUnits(TarvexLengthUnit_Millimeter);
     for (unsigned int reference = 1; reference <= kReferences; ++reference)
-        model.AddPart(reference, VizPort::Widen("Part" + std::to_string(reference)));
+        model.AddPart(reference, VizPort::Widen("Part" + std::to_string(reference))).visu =
+            Geometry();
     for (unsigned int instance = 0; instance < instances; ++instance) {
         unsigned int const reference = instance % kReferences + 1;
         TarvexPlacement placement;
@@ -150,13 +127,11 @@ std::unique_ptr<VizProductStructure> MakeProduct(unsigned int instances) {
     TarvexPSImportResult const result = model.GetImportResult();
     TarvexInputProductStructure const input = model.GetInputProductStructure();
     TarvexDocument document = model.GetDocument();
-    VizProductStructure* raw = nullptr;
-    VizBuilder::MakeVizProductStructure(result, input, document, raw);
-    std::unique_ptr<VizProductStructure> structure(raw); // the host owns it
-    for (unsigned int reference = 1; reference <= kReferences; ++reference) {
-        int const id = static_cast<int>(reference);
-        VizProductStructureTestPeer::addVizContainer(*structure, id, MakeGeometry(id));
-    }
+    std::unique_ptr<VizProductStructure> structure =
+        VizBridgeTarvex::MakeUniqueVizProductStructure(result, input, document);
+    VizBuilder builder(*structure, input, nullptr);
+    builder.SetImportVisu(true);
+    builder.ImportAndBuildPS();
     return structure;
 }
 
@@ -169,9 +144,7 @@ std::unique_ptr<SceneBuilder> MakeScene() {
 
 std::unique_ptr<TarvexRenderer> MakeRenderer(VizProductStructure& structure,
                                              SceneBuilder& builder) {
-    // The caller owns the new renderer.
-    return std::unique_ptr<TarvexRenderer>(
-        TarvexRenderer::MakeRenderer(&structure, nullptr, &builder, 0.0, 0.0, 0.0));
+    return VizBridgeTarvex::MakeUniqueRenderer(&structure, nullptr, &builder);
 }
 
 struct SceneCount {

@@ -1,19 +1,19 @@
-#include "examples/ContainerReport.h"
+#include "ContainerReport.h"
 
-#include "contracts/kolba/VizCapture.h"
-#include "contracts/kolba/VizContainer.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPMIContainer.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizPoints.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/kolba/VizView.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/kolba/VizContainer.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <cstddef>
 #include <string>

@@ -1,27 +1,34 @@
 // vizbridge_demo: a host that imports the bundled sample assembly and prints what VizBridge
 // made of it. Each step of the road is one function below.
 
-#include "examples/ContainerReport.h"
-#include "examples/SampleAssembly.h"
+#include "ContainerReport.h"
+#include "SampleAssembly.h"
 
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
-#include "contracts/kolba/RecordingView3D.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/View3DAdapter.h"
-#include "contracts/platform/DebugOutput.h"
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexMultiProcess.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
-#include "import/VizBuilder.h"
-#include "model/VizProductStructure.h"
-#include "render/TarvexRenderer.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/RecordingView3D.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/View3DAdapter.h>
+#include <VizBridge/contracts/platform/DebugOutput.h>
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/UniqueProductStructure.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
+#include <VizBridge/render/TarvexRenderer.h>
+#include <VizBridge/render/UniqueRenderer.h>
 
+#include <chrono>
+#include <cstddef>
 #include <exception>
 #include <iostream>
 #include <memory>
+#include <string>
+#include <vector>
 
 namespace {
 
@@ -43,21 +50,13 @@ void PrintDebugText(char16_t const* text) {
     std::cerr << "  [debug] " << Narrow(text) << '\n';
 }
 
-/// Step 1: the structure, its document strings, missing files and instance tree.
-/// MakeVizProductStructure hands the structure over; from here on the host owns it.
+/// Step 1: the structure, its document strings, missing files and instance tree. The
+/// structure is the host's from here on.
 std::unique_ptr<VizProductStructure> MakeStructure(TarvexModel const& model,
                                                    TarvexInputProductStructure const& input) {
     TarvexPSImportResult const result = model.GetImportResult();
     TarvexDocument document = model.GetDocument();
-    VizProductStructure* structure = nullptr;
-    try {
-        VizBuilder::MakeVizProductStructure(result, input, document, structure);
-    } catch (...) {
-        // Only with KolbaVizCore's throw switch on: what was built is already the host's.
-        delete structure;
-        throw;
-    }
-    return std::unique_ptr<VizProductStructure>(structure);
+    return VizBridgeTarvex::MakeUniqueVizProductStructure(result, input, document);
 }
 
 struct ImportTimes {
@@ -138,21 +137,54 @@ void PrintRenderProgress(int const& done, int const& total, char const* phase) {
     std::cout << "  render " << phase << ' ' << done << '/' << total << '\n';
 }
 
+/// What one road made, for the summary at the end.
+struct RoadSummary {
+    std::string road;
+    std::size_t instances = 0;
+    int containers = 0; ///< part, geometry and PMI containers
+    std::size_t errors = 0;
+    std::size_t nodes = 0; ///< scene nodes after the render
+    double importSeconds = 0.0;
+    double renderSeconds = 0.0;
+};
+
+double SecondsSince(std::chrono::steady_clock::time_point start) {
+    return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+}
+
+std::size_t CountInstances(std::vector<VizBridgeTarvex::VizPSEntry*> const& entries) {
+    std::size_t count = entries.size();
+    for (VizBridgeTarvex::VizPSEntry const* const entry : entries)
+        count += CountInstances(entry->GetChildren());
+    return count;
+}
+
+void Summarise(VizProductStructure const& structure, RoadSummary& summary) {
+    summary.instances = CountInstances(structure.GetChildren());
+    summary.containers = structure.GetNumberOfVizPartContainers() +
+                         structure.GetNumberOfVizContainers() +
+                         structure.GetNumberOfVizPMIContainers();
+    summary.errors = structure.GetErrorMessages().size();
+}
+
 /// Step 4: a renderer draws the structure into the host's scene. The host keeps the scene
 /// builder, the view and the modeler (if any) alive for as long as the renderer lives;
 /// deleting the renderer removes what it drew. `printScene`: print the whole scene tree.
 void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModelerServices* modeler,
-                     bool printScene) {
+                     bool printScene, RoadSummary& summary) {
     KolbaVizCore::RecordingView3D view;
     KolbaVizCore::SceneBuilder scene;
     KolbaVizCore::View3DAdapter adapter(&view, &scene);
     scene.SetView3DAdapter(&adapter);
     scene.SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
 
-    std::unique_ptr<VizBridgeTarvex::TarvexRenderer> renderer(
-        VizBridgeTarvex::TarvexRenderer::MakeRenderer(&structure, modeler, &scene, 0.0, 0.0, 0.0));
+    std::unique_ptr<VizBridgeTarvex::TarvexRenderer> renderer =
+        VizBridgeTarvex::MakeUniqueRenderer(&structure, modeler, &scene);
     renderer->SetProgressCallback(&PrintRenderProgress);
+    auto const start = std::chrono::steady_clock::now();
     bool const rendered = renderer->Render();
+    summary.renderSeconds = SecondsSince(start);
+    summary.nodes = scene.GetNodeCount();
     std::cout << "Rendered: " << (rendered ? "yes" : "no") << ", " << scene.GetNodeCount()
               << " nodes\n";
     if (printScene)
@@ -172,15 +204,19 @@ void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModeler
 
 /// The whole road once, with the import spread over `processors` processes (0: all the
 /// machine has; 1: the caller's process alone).
-void RunRoad(VizBridgeExamples::SampleAssembly const& sample, int processors) {
+RoadSummary RunRoad(VizBridgeExamples::SampleAssembly const& sample, int processors) {
+    RoadSummary summary{processors == 1 ? "BREP, caller's process" : "BREP, spooler"};
     TarvexMultiProcess::SetNumberOfProcessorsToUse(processors);
     TarvexInputProductStructure const input = sample.GetModel().GetInputProductStructure();
     VizReferenceModeler::ReferenceModelerServices modeler;
 
+    auto const start = std::chrono::steady_clock::now();
     std::cout << "Building the product structure\n";
     std::unique_ptr<VizProductStructure> structure = MakeStructure(sample.GetModel(), input);
     std::cout << "Importing\n";
     ImportTimes const times = ImportData(*structure, input, modeler);
+    summary.importSeconds = SecondsSince(start);
+    Summarise(*structure, summary);
 
     PrintTree(*structure);
     std::cout << "Document:\n";
@@ -189,10 +225,11 @@ void RunRoad(VizBridgeExamples::SampleAssembly const& sample, int processors) {
     PrintFailures(*structure);
     PrintTimes(times);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, &modeler, true);
+    RenderStructure(*structure, &modeler, true, summary);
 
     // The structure goes last: after the builder and every renderer made on it.
     structure.reset();
+    return summary;
 }
 
 /// What the visualisation import made of each part of the sample.
@@ -216,32 +253,51 @@ void PrintContainers(VizProductStructure const& structure) {
 
 /// The road with tessellated data: import the parts' visualisation data and PMI, print the
 /// containers, render them. `tesselateText`: PMI texts become strokes and filled glyphs.
-void RunVisualisationRoad(VizBridgeExamples::SampleAssembly const& sample, bool tesselateText) {
+RoadSummary RunVisualisationRoad(VizBridgeExamples::SampleAssembly const& sample,
+                                 bool tesselateText) {
+    RoadSummary summary{tesselateText ? "tessellated, texts as glyphs" : "tessellated, texts"};
     TarvexMultiProcess::SetNumberOfProcessorsToUse(1);
     TarvexInputProductStructure const input = sample.GetModel().GetInputProductStructure();
+    auto const start = std::chrono::steady_clock::now();
     std::unique_ptr<VizProductStructure> structure = MakeStructure(sample.GetModel(), input);
     structure->SetTesselatingText(tesselateText); // read by the import, leaf by leaf
     std::cout << "Importing visualisation data and PMI\n";
     ImportVisualisation(*structure, input);
+    summary.importSeconds = SecondsSince(start);
+    Summarise(*structure, summary);
     PrintContainers(*structure);
     PrintFailures(*structure);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, nullptr, false);
+    RenderStructure(*structure, nullptr, false, summary);
     structure.reset();
+    return summary;
+}
+
+void PrintSummary(std::vector<RoadSummary> const& summaries) {
+    std::cout << "\n=== Summary\n";
+    for (RoadSummary const& s : summaries)
+        std::cout << "  " << s.road << ": " << s.instances << " instances, " << s.containers
+                  << " containers, " << s.errors << " error texts, " << s.nodes
+                  << " scene nodes; import " << s.importSeconds * 1000.0 << " ms, render "
+                  << s.renderSeconds * 1000.0 << " ms\n";
 }
 
 int main() {
     try {
         VizPort::ScopedDebugSink const debugToStderr(&PrintDebugText);
+        std::cout << "==================== vizbridge_demo: the bundled sample assembly "
+                     "through VizBridge ====================\n";
         VizBridgeExamples::SampleAssembly const sample;
+        std::vector<RoadSummary> summaries;
         std::cout << "=== Import in the caller's process\n";
-        RunRoad(sample, 1);
+        summaries.push_back(RunRoad(sample, 1));
         std::cout << "\n=== Import through the multi-process spooler\n";
-        RunRoad(sample, 0);
+        summaries.push_back(RunRoad(sample, 0));
         std::cout << "\n=== Visualisation data and PMI, texts kept as texts\n";
-        RunVisualisationRoad(sample, false);
+        summaries.push_back(RunVisualisationRoad(sample, false));
         std::cout << "\n=== Visualisation data and PMI, texts tessellated\n";
-        RunVisualisationRoad(sample, true);
+        summaries.push_back(RunVisualisationRoad(sample, true));
+        PrintSummary(summaries);
         return 0;
     } catch (std::exception const& e) {
         std::cerr << "vizbridge_demo: " << e.what() << '\n';

@@ -1,6 +1,6 @@
-#include "examples/SampleAssembly.h"
+#include "SampleAssembly.h"
 
-#include "examples/SampleBox.h"
+#include "SampleBox.h"
 
 #include <array>
 #include <vector>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexModel.h"
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
 
 namespace VizBridgeExamples {
 

@@ -1,4 +1,4 @@
-#include "examples/SampleBox.h"
+#include "SampleBox.h"
 
 #include <string>
 

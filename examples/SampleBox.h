@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexAuthoredPartGeometry.h"
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredPartGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
 
 #include <array>
 

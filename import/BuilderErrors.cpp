@@ -1,7 +1,7 @@
-#include "import/BuilderErrors.h"
+#include <VizBridge/import/BuilderErrors.h>
 
-#include "contracts/platform/DebugOutput.h"
-#include "contracts/platform/FormatW.h"
+#include <VizBridge/contracts/platform/DebugOutput.h>
+#include <VizBridge/contracts/platform/FormatW.h>
 
 #include <string>
 
@@ -45,6 +45,22 @@ void formatExceptionError(WString const& stage, int const& id, std::exception co
 void formatUnknownError(WString const& stage, int const& id, WString const& text, WString& out) {
     out = VizPort::FormatW(kBufferSize, u"%s (RefID %d) Error : %s",
                            {stage.c_str(), id, text.c_str()});
+}
+
+Failure describeCurrentFailure(FailureSite const& site, int const& id) {
+    Failure failure;
+    try {
+        throw;
+    } catch (std::exception const& e) {
+        failure.what = e.what() ? e.what() : "";
+        reportDebugError(id, VizPort::Widen(failure.what));
+        formatExceptionError(site.stage, id, e, failure.text);
+    } catch (...) {
+        reportDebugError(id, site.unknownDebug);
+        formatUnknownError(site.unknownStage, id, u"Unknown Exception", failure.text);
+        failure.what = VizPort::Narrow(failure.text);
+    }
+    return failure;
 }
 
 } // namespace VizBridgeTarvex::BuilderErrors

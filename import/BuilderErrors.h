@@ -1,8 +1,9 @@
 #pragma once
 
-#include "model/VizTypes.h"
+#include <VizBridge/model/VizTypes.h>
 
 #include <exception>
+#include <string>
 
 namespace VizBridgeTarvex::BuilderErrors {
 
@@ -21,5 +22,35 @@ void formatExceptionError(WString const& stage, int const& id, std::exception co
 
 /// "<stage> (RefID <id>) Error : <text>", for whatever was caught that is no std::exception.
 void formatUnknownError(WString const& stage, int const& id, WString const& text, WString& out);
+
+/// A place of the import that catches failures, with the texts it records them under.
+struct FailureSite {
+    char16_t const* stage;        ///< of a std::exception
+    char16_t const* unknownStage; ///< of anything else
+    char16_t const* unknownDebug; ///< the debug text of anything else
+};
+
+/// Around each child of the instance tree.
+inline constexpr FailureSite kStructureInstanceSite{
+    u"Product Structure Instance", u"Product Structure Part Import",
+    u"Unknown exception while importing Product Structure"};
+/// Around the modeler's import of one part.
+inline constexpr FailureSite kPartImportSite{
+    u"Part Import", u"Part Import", u"Unknown exception while importing product structure"};
+/// Around the visualisation import of one part.
+inline constexpr FailureSite kVisuDataImportSite{
+    u"VisuData Import", u"VisuData Import", u"Unknown exception while importing product structure"};
+
+/// What a failure left to record: the stored text, and the text of the exception that a
+/// site throws on when it must.
+struct Failure {
+    WString text;
+    std::string what; ///< what() of a std::exception; else the stored text, narrowed
+};
+
+/// The one way the import records a failure. Called from inside a catch block, it looks at
+/// the exception being handled: writes its plain text to the debug output ("Error on RefID
+/// <id>: ...") and gives the text to store, formatted for `site`.
+Failure describeCurrentFailure(FailureSite const& site, int const& id);
 
 } // namespace VizBridgeTarvex::BuilderErrors

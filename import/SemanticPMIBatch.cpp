@@ -1,4 +1,4 @@
-#include "import/SemanticPMIBatch.h"
+#include <VizBridge/import/SemanticPMIBatch.h>
 
 namespace VizBridgeTarvex {
 

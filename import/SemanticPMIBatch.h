@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/SemanticPMIMaps.h"
+#include <VizBridge/model/SemanticPMIMaps.h>
 
 namespace VizBridgeTarvex {
 

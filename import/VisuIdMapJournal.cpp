@@ -1,4 +1,4 @@
-#include "import/VisuIdMapJournal.h"
+#include <VizBridge/import/VisuIdMapJournal.h>
 
 namespace VizBridgeTarvex {
 

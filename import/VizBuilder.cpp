@@ -1,19 +1,19 @@
-#include "import/VizBuilder.h"
-#include "import/TarvexTexts.h"
+#include <VizBridge/import/VizBuilder.h>
 
-#include "contracts/kolba/AllowThrow.h"
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputPSInstance.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexLengthUnitUtils.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "import/BuilderErrors.h"
-#include "model/VizPSEntry.h"
-#include "model/VizPSInstanceBuilder.h"
-#include "model/VizPartContainer.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/contracts/kolba/AllowThrow.h>
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitUtils.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/BuilderErrors.h>
+#include <VizBridge/import/VizPSInstanceBuilder.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizPartContainer.h>
+#include <VizBridge/model/VizProductStructure.h>
 
 #include <algorithm>
 #include <memory>
@@ -25,31 +25,43 @@ using namespace BuilderErrors;
 
 namespace {
 
-/// Records a failure while building the instance tree: the plain text on the debug output,
-/// the formatted one appended under `id`. Returns the stored text.
-WString recordStructureException(VizProductStructure& structure, int const& id,
-                                 std::exception const& e,
-                                 void (VizProductStructure::*append)(int const&, WString const&)) {
-    reportDebugError(id, VizPort::Widen(e.what() ? e.what() : ""));
-    WString text;
-    formatExceptionError(u"Product Structure Instance", id, e, text);
-    (structure.*append)(id, text);
-    return text;
+/// A new entry for `instance` of `reference`, owned by the caller.
+std::unique_ptr<VizPSEntry> makeEntry(TarvexInputPSInstance const& instance,
+                                      TarvexInputPSReference const& reference) {
+    VizPSEntry* entry = nullptr;
+    VizPSInstanceBuilder::MakeVizPSInstance(instance, reference, entry);
+    return std::unique_ptr<VizPSEntry>(entry);
 }
+
 } // namespace
 
 // ---------------------------------------------------------------------------------------------
 // The instance tree
 
-void VizBuilder::MakeVizProductStructure(TarvexPSImportResult const& result,
-                                         TarvexInputProductStructure const& input,
-                                         TarvexDocument& document, VizProductStructure*& out) {
+void VizBuilder::addSinglePart(VizProductStructure& structure, WString const& name,
+                               std::unique_ptr<VizPartContainer> container) {
+    VizPSEntry* made = nullptr;
+    VizPSInstanceBuilder::MakeVizPSInstance(1, name, made);
+    std::unique_ptr<VizPSEntry> entry(made);
+    VizPSEntry* const root = entry.get();
+    structure.AddSubAssembly(1, std::move(entry));
+    structure.AddRootEntry(root);
+    structure.AddVizPartContainer(1, std::move(container));
+}
+
+VizProductStructure& VizBuilder::newStructure(TarvexInputProductStructure const& input,
+                                              VizProductStructure*& out) {
     TarvexWString const productName = input.GetProductName();
     char16_t const* name = nullptr;
     productName.ToWChar(name);
     out = new VizProductStructure(name); // the host owns it from here on
-    VizProductStructure& structure = *out;
+    return *out;
+}
 
+void VizBuilder::MakeVizProductStructure(TarvexPSImportResult const& result,
+                                         TarvexInputProductStructure const& input,
+                                         TarvexDocument& document, VizProductStructure*& out) {
+    VizProductStructure& structure = newStructure(input, out);
     getDocumentInfo(document, structure);
 
     // Before any instance: defineMissingFile reads the list.
@@ -65,11 +77,10 @@ void VizBuilder::MakeVizProductStructure(TarvexPSImportResult const& result,
     for (int i = 0; i < rootCount; ++i) {
         int id = 0;
         TarvexInputPSReference reference;
-        bool descend = false;
-        VizPSEntry* entry = nullptr;
-        // A root is guarded like a child: with the throw switch off a failing root is
-        // recorded and the next one is built. With the switch on the exception reaches the
-        // caller unchanged.
+        VizPSEntry* root = nullptr;
+        // A root is guarded like a child, so that with the throw switch off a root that
+        // cannot be read costs only itself. With the switch on nothing here catches: the
+        // exception reaches the caller as it came.
         try {
             TarvexInputPSInstance const instance = input.GetRootInstance(i);
             reference = instance.GetReference();
@@ -79,30 +90,21 @@ void VizBuilder::MakeVizProductStructure(TarvexPSImportResult const& result,
             bool const missing = defineMissingFile(structure, id, reference);
             if (!missing && !isPart && instanceCount < 1)
                 continue; // an empty sub-assembly gets no entry
-            VizPSInstanceBuilder::MakeVizPSInstance(instance, reference, entry);
-            if (entry) {
-                structure.AddSubAssembly(id, entry);
-                structure.AddRootEntry(entry);
-                descend = !isPart;
-            }
-        } catch (std::exception const& e) {
-            if (KolbaVizCore::GetAllowThrow())
-                throw;
-            recordStructureException(structure, id, e, &VizProductStructure::appendImportError);
-            continue;
+            std::unique_ptr<VizPSEntry> entry = makeEntry(instance, reference);
+            root = entry.get();
+            structure.AddSubAssembly(id, std::move(entry));
+            structure.AddRootEntry(root);
+            if (isPart)
+                continue;
         } catch (...) {
             if (KolbaVizCore::GetAllowThrow())
                 throw;
-            reportDebugError(id, u"Unknown exception while importing Product Structure");
-            WString text;
-            formatUnknownError(u"Product Structure Part Import", id, u"Unknown Exception", text);
-            structure.appendImportError(id, text);
+            structure.appendImportError(id,
+                                        describeCurrentFailure(kStructureInstanceSite, id).text);
             continue;
         }
-        if (descend) {
-            std::vector<int> ancestors{id};
-            loadReferenceStructure(structure, reference, entry, ancestors);
-        }
+        std::vector<int> ancestors{id};
+        loadReferenceStructure(structure, reference, root, ancestors);
     }
 
     setConfigurationAndUnits(input, structure);
@@ -112,26 +114,13 @@ void VizBuilder::MakeVizProductStructure(TarvexPSImportResult const& /*result*/,
                                          TarvexInputProductStructure const& input,
                                          TarvexDocument& document, VizPartContainer* container,
                                          VizProductStructure*& out) {
-    // Ours from the call on: an exception before it is stored frees it.
+    // Ours from the call on: an exception before it is stored frees it. A null container
+    // stands under the part's id as null.
     std::unique_ptr<VizPartContainer> owned(container);
-
-    TarvexWString const productName = input.GetProductName();
-    char16_t const* name = nullptr;
-    productName.ToWChar(name);
-    out = new VizProductStructure(name); // the host owns it from here on
-    VizProductStructure& structure = *out;
-
+    VizProductStructure& structure = newStructure(input, out);
     getDocumentInfo(document, structure);
     structure.SetContainerCount(1);
-
-    VizPSEntry* entry = nullptr;
-    VizPSInstanceBuilder::MakeVizPSInstance(1, structure.GetProductName(), entry);
-    if (entry) {
-        structure.AddSubAssembly(1, entry);
-        structure.AddRootEntry(entry);
-        structure.AddVizPartContainer(1, owned.release());
-    }
-
+    addSinglePart(structure, structure.GetProductName(), std::move(owned));
     setConfigurationAndUnits(input, structure);
 }
 
@@ -146,18 +135,10 @@ void VizBuilder::MakeVizProductStructure(VizDocumentInfo const& info, VizPartCon
     VizProductStructure& structure = *out;
     structure.assignDocumentInfo(info);
     structure.SetContainerCount(1);
-
-    VizPSEntry* entry = nullptr;
-    VizPSInstanceBuilder::MakeVizPSInstance(1, info.productName, entry);
-    if (entry) {
-        structure.AddSubAssembly(1, entry);
-        structure.AddRootEntry(entry);
-        structure.AddVizPartContainer(1, owned.release());
-    }
+    addSinglePart(structure, info.productName, std::move(owned));
 
     WString units;
-    if (textOf(TarvexLengthUnitUtils::LengthUnitToString(static_cast<TarvexLengthUnitType>(0)),
-               units))
+    if (textOf(TarvexLengthUnitUtils::LengthUnitToString(TarvexLengthUnit_Unknown), units))
         structure.setUnits(units);
 }
 
@@ -180,32 +161,24 @@ void VizBuilder::loadReferenceStructure(VizProductStructure& structure,
                 continue;
             if (!isPart && std::find(ancestors.begin(), ancestors.end(), id) != ancestors.end())
                 throw std::runtime_error("Reference contains itself");
-            VizPSEntry* entry = nullptr;
-            VizPSInstanceBuilder::MakeVizPSInstance(instance, child, entry);
-            if (entry) {
-                parent->AddChild(entry);
-                structure.AddSubAssembly(id, entry);
-                // Inside the guard: a failure below is recorded again under this child.
-                if (!isPart) {
-                    ancestors.push_back(id);
-                    struct PopOnExit {
-                        std::vector<int>& path;
-                        ~PopOnExit() { path.pop_back(); }
-                    } const pop{ancestors};
-                    loadReferenceStructure(structure, child, entry, ancestors);
-                }
+            std::unique_ptr<VizPSEntry> entry = makeEntry(instance, child);
+            VizPSEntry* const added = entry.get();
+            parent->AddChild(added);
+            structure.AddSubAssembly(id, std::move(entry));
+            // Inside the guard: a failure below is recorded again under this child.
+            if (!isPart) {
+                ancestors.push_back(id);
+                struct PopOnExit {
+                    std::vector<int>& path;
+                    ~PopOnExit() { path.pop_back(); }
+                } const pop{ancestors};
+                loadReferenceStructure(structure, child, added, ancestors);
             }
-        } catch (std::exception const& e) {
-            recordStructureException(structure, id, e, &VizProductStructure::appendImportError);
-            if (KolbaVizCore::GetAllowThrow())
-                throw std::runtime_error(e.what() ? e.what() : "");
         } catch (...) {
-            reportDebugError(id, u"Unknown exception while importing Product Structure");
-            WString text;
-            formatUnknownError(u"Product Structure Part Import", id, u"Unknown Exception", text);
-            structure.appendImportError(id, text);
+            Failure const failure = describeCurrentFailure(kStructureInstanceSite, id);
+            structure.appendImportError(id, failure.text);
             if (KolbaVizCore::GetAllowThrow())
-                throw std::runtime_error(VizPort::Narrow(text));
+                throw std::runtime_error(failure.what);
         }
     }
 }
@@ -282,9 +255,14 @@ void VizBuilder::resetTimers() {
     m_totalImportSemanticPMITime = 0.0;
 }
 
-// The product-level phases import what the product-level importers of the import library
-// give; until those exist there is nothing at product level to import.
-void VizBuilder::loadProductStructureGraphicalData() {}
-void VizBuilder::loadProductStructureAssemblyData() {}
+void VizBuilder::loadProductStructureGraphicalData() {
+    // Not built yet: the import library's product-level visualisation importer is still to
+    // come, so the assembly's own visualisation data is not imported.
+}
+
+void VizBuilder::loadProductStructureAssemblyData() {
+    // Not built yet: the import library's product-level data importer and the semantic PMI
+    // conversion are still to come, so the assembly's own PMI is not imported.
+}
 
 } // namespace VizBridgeTarvex

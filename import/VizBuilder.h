@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuNode.h"
-#include "model/SemanticPMIMaps.h"
-#include "model/VizDocumentInfo.h"
-#include "model/VizTypes.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
+#include <VizBridge/model/SemanticPMIMaps.h>
+#include <VizBridge/model/VizDocumentInfo.h>
+#include <VizBridge/model/VizTypes.h>
 
 #include <map>
 #include <memory>
@@ -63,7 +63,10 @@ public:
 
     VizBuilder(VizProductStructure& structure, TarvexInputProductStructure const& input,
                TarvexPolicy* policy);
+    /// Member-wise: the copy works on the same structure and input with the same settings,
+    /// and shares the visual id map's state, including the elements it keeps alive.
     VizBuilder(VizBuilder const&) = default;
+    VizBuilder& operator=(VizBuilder const&) = delete; // it holds references
     ~VizBuilder() = default;
 
     /// Runs the instance data, graphical data and assembly data phases, in this order.
@@ -91,6 +94,15 @@ private:
     static void loadReferenceStructure(VizProductStructure& structure,
                                        TarvexInputPSReference const& reference, VizPSEntry* parent,
                                        std::vector<int>& ancestors);
+    /// A new structure named after the input's product, handed to the caller through `out`
+    /// before anything else is done, so that with the throw switch on the host owns what an
+    /// exception leaves behind.
+    static VizProductStructure& newStructure(TarvexInputProductStructure const& input,
+                                             VizProductStructure*& out);
+    /// The one entry of a structure made around a single part, under the reference id 1, and
+    /// its container, which may be null.
+    static void addSinglePart(VizProductStructure& structure, WString const& name,
+                              std::unique_ptr<VizPartContainer> container);
     static bool defineMissingFile(VizProductStructure& structure, int const& id,
                                   TarvexInputPSReference const& reference);
     static void getDocumentInfo(TarvexDocument& document, VizProductStructure& structure);
@@ -156,8 +168,10 @@ private:
     int m_numberOfProcessorsUsed = 1;
     std::map<WString, VizElement*> m_visuIdMap; ///< elements not owned
     /// Elements that a leaf loaded but that stand in no container: the first load of a
-    /// constructed geometry for FTA. Kept as long as m_visuIdMap may point into them.
-    std::vector<std::unique_ptr<VizElement>> m_unlistedElements;
+    /// constructed geometry for FTA. Kept as long as m_visuIdMap, or a copy's, may point into
+    /// them: shared with the copies of this builder.
+    std::shared_ptr<std::vector<std::unique_ptr<VizElement>>> m_unlistedElements =
+        std::make_shared<std::vector<std::unique_ptr<VizElement>>>();
 };
 
 } // namespace VizBridgeTarvex

@@ -1,26 +1,27 @@
 // The instance data phase of VizBuilder: every reference of the tree is imported, in the
 // caller's process along the tree, or as the import library's spooler delivers it.
 
-#include "contracts/kolba/Stopwatch.h"
-#include "contracts/platform/DebugOutput.h"
-#include "contracts/platform/FormatW.h"
-#include "contracts/platform/Sleep.h"
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexInputPSInstance.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexInstanceEntity.h"
-#include "contracts/tarvex/TarvexMultiProcess.h"
-#include "contracts/tarvex/TarvexMultiProcessSpooler.h"
-#include "contracts/tarvex/TarvexPMIData.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexPartImportResult.h"
-#include "import/BuilderErrors.h"
-#include "import/SemanticPMIBatch.h"
-#include "import/TarvexTexts.h"
-#include "import/VizBuilder.h"
-#include "model/VizProductStructure.h"
-#include "services/VizModelerServices.h"
+#include <VizBridge/contracts/kolba/Stopwatch.h>
+#include <VizBridge/contracts/platform/DebugOutput.h>
+#include <VizBridge/contracts/platform/FormatW.h>
+#include <VizBridge/contracts/platform/Sleep.h>
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcessSpooler.h>
+#include <VizBridge/contracts/tarvex/TarvexPMIData.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
+#include <VizBridge/import/BuilderErrors.h>
+#include <VizBridge/import/SemanticPMIBatch.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/model/VizPartContainer.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/services/VizModelerServices.h>
 
 #include <algorithm>
 
@@ -39,6 +40,11 @@ void stopInto(KolbaVizCore::Stopwatch& stopwatch, double& total) {
 } // namespace
 
 void VizBuilder::loadProductStructureInstanceData() {
+    if (!m_importVisu && !m_modelerServices) {
+        // Each part then fails with a text that gives no reason: say it once, here.
+        VizPort::OutputDebugStringW(
+            u"VizBuilder: no modeler services are set, so no BREP part can be imported");
+    }
     int const references = m_inputProductStructure.GetUniqueReferencesCount();
     int const toUse = TarvexMultiProcess::GetNumberOfProcessorsToUse();
     int const physical = TarvexMultiProcess::GetNumberOfPhysicalProcessors();
@@ -206,7 +212,8 @@ void VizBuilder::importBREPFromReference(TarvexInputPSReference const& reference
 
         if (ok && container) {
             // Stored before the PMI is read: a failure there leaves the container in place.
-            m_productStructure.AddVizPartContainer(id, container);
+            m_productStructure.AddVizPartContainer(id,
+                                                   std::unique_ptr<VizPartContainer>(container));
             TarvexPMIData data = result.GetPMIData();
             processSemanticPMI(data, semanticPMI);
             return;
@@ -217,18 +224,9 @@ void VizBuilder::importBREPFromReference(TarvexInputPSReference const& reference
         if (!error.empty())
             message += u" Failed with error : " + error;
         m_productStructure.setImportError(id, message);
-    } catch (std::exception const& e) {
-        stopInto(stopwatch, m_totalImportBrepTime);
-        reportDebugError(id, VizPort::Widen(e.what() ? e.what() : ""));
-        WString text;
-        formatExceptionError(u"Part Import", id, e, text);
-        m_productStructure.setImportError(id, text);
     } catch (...) {
         stopInto(stopwatch, m_totalImportBrepTime);
-        reportDebugError(id, u"Unknown exception while importing product structure");
-        WString text;
-        formatUnknownError(u"Part Import", id, u"Unknown Exception", text);
-        m_productStructure.setImportError(id, text);
+        m_productStructure.setImportError(id, describeCurrentFailure(kPartImportSite, id).text);
     }
 }
 
@@ -247,10 +245,11 @@ VizBuilder::getVizPartContainerFromReference(TarvexInputPSReference const& refer
                                             path);
 }
 
-// Semantic PMI arrives with the PMI objects of the import library; until then a part has
-// none to add.
 void VizBuilder::processSemanticPMI(TarvexPMIData& /*data*/,
-                                    SemanticPMIByReference& /*semanticPMI*/) {}
+                                    SemanticPMIByReference& /*semanticPMI*/) {
+    // Not built yet: the import library's PMI objects and the semantic loaders are still to
+    // come, so a part gives no semantic PMI records.
+}
 
 void VizBuilder::handOverSemanticPMI(SemanticPMIBatch& batch) {
     for (auto& [id, records] : batch.map()) {

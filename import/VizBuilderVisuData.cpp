@@ -1,38 +1,38 @@
 // The visualisation data of one reference: its import, the conversion of its flat node list
 // into a VizContainer and a VizPMIContainer, and the linking of PMI to mechanical ids.
-#include "contracts/kolba/Stopwatch.h"
-#include "contracts/kolba/VizCapture.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizView.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexLengthUnitUtils.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuCaptureIter.h"
-#include "contracts/tarvex/TarvexVisuData.h"
-#include "contracts/tarvex/TarvexVisuImportResult.h"
-#include "contracts/tarvex/TarvexVisuNodeIter.h"
-#include "contracts/tarvex/TarvexVisuViewIter.h"
-#include "contracts/tarvex/TarvexVisualizationImporter.h"
-#include "import/BuilderErrors.h"
-#include "import/TarvexTexts.h"
-#include "import/VisuIdMapJournal.h"
-#include "import/VizBuilder.h"
-#include "loaders/LoadAs.h"
-#include "loaders/VizCaptureLoader.h"
-#include "loaders/VizMeshLoader.h"
-#include "loaders/VizPMILoader.h"
-#include "loaders/VizPointSetLoader.h"
-#include "loaders/VizViewLoader.h"
-#include "loaders/VizWireLoader.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/contracts/kolba/Stopwatch.h>
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitUtils.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCaptureIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNodeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuViewIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisualizationImporter.h>
+#include <VizBridge/import/BuilderErrors.h>
+#include <VizBridge/import/VisuIdMapJournal.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/loaders/HandOver.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VizCaptureLoader.h>
+#include <VizBridge/loaders/VizMeshLoader.h>
+#include <VizBridge/loaders/VizPMILoader.h>
+#include <VizBridge/loaders/VizPointSetLoader.h>
+#include <VizBridge/loaders/VizViewLoader.h>
+#include <VizBridge/loaders/VizWireLoader.h>
+#include <VizBridge/model/VizProductStructure.h>
 
-#include <cstdint>
 #include <exception>
 #include <memory>
 
@@ -48,21 +48,8 @@ using KolbaVizCore::VizWire;
 
 namespace {
 
-constexpr int kMeshNode = 5;
-constexpr int kWireNode = 7;
-constexpr int kPointSetNode = 9;
-constexpr int kConstructedGeometry = 2;
-constexpr int kFTAConstructedGeometry = 3;
-constexpr TarvexLengthUnitType kContainerUnit = static_cast<TarvexLengthUnitType>(4);
-
-/// Hands `element` to a list that takes it over, and lets go of it only once it is in.
-template <class Owner, class Element>
-Element* handTo(Owner& owner, void (Owner::*add)(Element*), std::unique_ptr<Element>& element) {
-    Element* const raw = element.get();
-    (owner.*add)(raw);
-    element.release();
-    return raw;
-}
+/// The unit that the containers' scale factor converts to.
+constexpr TarvexLengthUnitType kContainerUnit = TarvexLengthUnit_Millimeter;
 
 /// The three lists a kind of geometry goes to, by geometry type.
 template <class Element> struct GeometryLists {
@@ -87,18 +74,22 @@ VizElement* loadGeometryLeaf(Source const& source, std::vector<TarvexVisuAttribu
         if (std::unique_ptr<Element> element = loadAs<Element>(loader)) {
             enterIds(*element);
             leaf = element.get();
-            if (geometryType == kFTAConstructedGeometry) {
+            if (geometryType == TarvexVisuGeometry_FTAConstructed) {
                 unlisted.push_back(std::move(element));
             } else {
-                handTo(*vizContainer,
-                       geometryType == kConstructedGeometry ? lists.constructed : lists.plain,
-                       element);
+                auto const list = geometryType == TarvexVisuGeometry_Constructed ? lists.constructed
+                                                                                 : lists.plain;
+                handOver(std::move(element), [vizContainer, list](Element* const piece) {
+                    (vizContainer->*list)(piece);
+                });
             }
         }
     }
-    if (pmiContainer && geometryType == kFTAConstructedGeometry) {
+    if (pmiContainer && geometryType == TarvexVisuGeometry_FTAConstructed) {
         if (std::unique_ptr<Element> element = loadAs<Element>(loader))
-            leaf = handTo(*pmiContainer, lists.fta, element);
+            leaf = handOver(std::move(element), [pmiContainer, &lists](Element* const piece) {
+                (pmiContainer->*lists.fta)(piece);
+            });
     }
     return leaf;
 }
@@ -123,25 +114,19 @@ void VizBuilder::importVisuDataFromReference(TarvexInputPSReference const& refer
         stopwatch.Stop();
         m_totalImportGeomTime += stopwatch.GetElapsedTime();
 
-        VizContainer* vizContainer = nullptr;
-        VizPMIContainer* pmiContainer = nullptr;
-        importGraphicalContainer(id, data, vizContainer, pmiContainer);
+        VizContainer* madeViz = nullptr;
+        VizPMIContainer* madePMI = nullptr;
+        importGraphicalContainer(id, data, madeViz, madePMI);
+        std::unique_ptr<VizContainer> vizContainer(madeViz); // handed to this call
+        std::unique_ptr<VizPMIContainer> pmiContainer(madePMI);
         if (!vizContainer && !pmiContainer)
             m_productStructure.setVisuError(id, u"Could not Import VisuData from " + name);
         if (vizContainer)
-            m_productStructure.AddVizContainer(id, vizContainer);
+            m_productStructure.AddVizContainer(id, std::move(vizContainer));
         if (pmiContainer)
-            m_productStructure.AddVizPMIContainer(id, pmiContainer);
-    } catch (std::exception const& e) {
-        reportDebugError(id, VizPort::Widen(e.what() ? e.what() : ""));
-        WString text;
-        formatExceptionError(u"VisuData Import", id, e, text);
-        m_productStructure.setVisuError(id, text);
+            m_productStructure.AddVizPMIContainer(id, std::move(pmiContainer));
     } catch (...) {
-        reportDebugError(id, u"Unknown exception while importing product structure");
-        WString text;
-        formatUnknownError(u"VisuData Import", id, u"Unknown Exception", text);
-        m_productStructure.setVisuError(id, text);
+        m_productStructure.setVisuError(id, describeCurrentFailure(kVisuDataImportSite, id).text);
     }
 }
 
@@ -187,19 +172,21 @@ void VizBuilder::importGraphicalContainer(int const& referenceId,
             TarvexVisuView const source = views.Current();
             VizViewLoader loader(source, nullptr, false);
             if (std::unique_ptr<VizView> view = loadAs<VizView>(loader))
-                handTo(*pmi, &VizPMIContainer::AddView, view);
+                handOver(std::move(view), [&pmi](VizView* const piece) { pmi->AddView(piece); });
         }
         TarvexVisuCaptureIter captures = data.GetCaptureIterator();
         while (captures.Next()) {
             TarvexVisuCapture const source = captures.Current();
             VizCaptureLoader loader(source, nullptr, false);
             if (std::unique_ptr<VizCapture> capture = loadAs<VizCapture>(loader))
-                handTo(*pmi, &VizPMIContainer::AddCapture, capture);
+                handOver(std::move(capture),
+                         [&pmi](VizCapture* const piece) { pmi->AddCapture(piece); });
         }
     }
     FillVizPMIMechIDs(pmi.get());
 
     journal.Commit();
+    // Handed to the caller, who files them.
     vizContainer = viz.release();
     pmiContainer = pmi.release();
 }
@@ -212,7 +199,7 @@ void VizBuilder::processVizLeaf(VizContainer* vizContainer, VizPMIContainer* pmi
     VizElement* element = nullptr;
     int const type = node.GetType();
     auto const noIds = [](VizElement const&) {};
-    if (type == kMeshNode) {
+    if (type == TarvexVisuNode::VisuMesh) {
         auto const enterMeshIds = [&journal](VizMesh& mesh) {
             std::map<WString, VizElement*> entries;
             mesh.FillVisuIdMap(entries);
@@ -222,26 +209,28 @@ void VizBuilder::processVizLeaf(VizContainer* vizContainer, VizPMIContainer* pmi
             node.GetMesh(), attributes, vizContainer, pmiContainer,
             GeometryLists<VizMesh>{&VizContainer::AddMesh, &VizContainer::AddCGMesh,
                                    &VizPMIContainer::AddVizFTACGMesh},
-            enterMeshIds, m_unlistedElements);
-    } else if (type == kWireNode) {
+            enterMeshIds, *m_unlistedElements);
+    } else if (type == TarvexVisuNode::VisuWire) {
         element = loadGeometryLeaf<VizWire, VizWireLoader>(
             node.GetWire(), attributes, vizContainer, pmiContainer,
             GeometryLists<VizWire>{&VizContainer::AddWire, &VizContainer::AddCGWire,
                                    &VizPMIContainer::AddVizFTACGWire},
-            noIds, m_unlistedElements);
-    } else if (type == kPointSetNode) {
+            noIds, *m_unlistedElements);
+    } else if (type == TarvexVisuNode::VisuPointSet) {
         element = loadGeometryLeaf<VizPointSet, VizPointSetLoader>(
             node.GetPointSet(), attributes, vizContainer, pmiContainer,
             GeometryLists<VizPointSet>{&VizContainer::AddPointSet, &VizContainer::AddCGPointSet,
                                        &VizPMIContainer::AddVizFTACGPointSet},
-            noIds, m_unlistedElements);
+            noIds, *m_unlistedElements);
     } else if (pmiContainer) {
         TarvexVisuPMI const source = node.GetPMI();
         bool const tesselate = m_productStructure.IsTesselatingText(); // read anew per leaf
         VizPMILoader loader(source, &attributes, nodeType, node.GetType(), tesselate);
         if (std::unique_ptr<VizPMI> pmi = loadAs<VizPMI>(loader)) {
             journal.Set(pmi->GetVisualID(), pmi.get());
-            element = handTo(*pmiContainer, &VizPMIContainer::AddVizPMI, pmi);
+            element = handOver(std::move(pmi), [pmiContainer](VizPMI* const piece) {
+                pmiContainer->AddVizPMI(piece);
+            });
         }
     }
 
@@ -256,13 +245,10 @@ void VizBuilder::processVizLeaf(VizContainer* vizContainer, VizPMIContainer* pmi
     unsigned short red = 0, green = 0, blue = 0, alpha = 255;
     bool const hasRGB = own.GetRGBColor(red, green, blue);
     bool const hasAlpha = own.GetAlphaColor(alpha);
-    auto const low = [](unsigned short channel) {
-        return static_cast<std::uint8_t>(channel & 0xFF);
-    };
     if (hasRGB)
-        color = RGBAColor(low(red), low(green), low(blue), 255);
+        color = RGBAColor(colorByte(red), colorByte(green), colorByte(blue), 255);
     if (hasAlpha)
-        color.alpha = low(alpha);
+        color.alpha = colorByte(alpha);
     if (hasRGB || hasAlpha)
         element->SetColor(color);
 }

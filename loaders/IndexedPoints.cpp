@@ -1,4 +1,4 @@
-#include "loaders/IndexedPoints.h"
+#include <VizBridge/loaders/IndexedPoints.h>
 
 namespace VizBridgeTarvex {
 

@@ -1,4 +1,4 @@
-#include "loaders/PMITypeMapping.h"
+#include <VizBridge/loaders/PMITypeMapping.h>
 
 namespace VizBridgeTarvex {
 

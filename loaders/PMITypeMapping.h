@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/EntityType.h"
-#include "contracts/kolba/VizPMIType.h"
-#include "contracts/tarvex/TarvexVisuNode.h"
+#include <VizBridge/contracts/kolba/EntityType.h>
+#include <VizBridge/contracts/kolba/VizPMIType.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
 
 // Translations between the import library's node types, the scene's PMI type numbers and the
 // entity types that tag PMI nodes. Node types 12 to 57 run in step with the PMI types 2 to 47;

@@ -1,16 +1,12 @@
-#include "loaders/VisuColor.h"
+#include <VizBridge/loaders/VisuColor.h>
 
-#include <cstdint>
+#include <VizBridge/loaders/TarvexValues.h>
 
 namespace VizBridgeTarvex {
 
 namespace {
 
 using KolbaVizCore::RGBAColor;
-
-std::uint8_t lowByte(unsigned short const value) {
-    return static_cast<std::uint8_t>(value & 0xFFu);
-}
 
 /// Asks `holder` for its colour; on success the colour's red, green and blue become it.
 template <class Holder> bool takeRgb(Holder const& holder, RGBAColor& working) {
@@ -19,9 +15,9 @@ template <class Holder> bool takeRgb(Holder const& holder, RGBAColor& working) {
     unsigned short blue = 0;
     if (!holder.GetRGBColor(red, green, blue))
         return false;
-    working.red = lowByte(red);
-    working.green = lowByte(green);
-    working.blue = lowByte(blue);
+    working.red = colorByte(red);
+    working.green = colorByte(green);
+    working.blue = colorByte(blue);
     return true;
 }
 
@@ -30,7 +26,7 @@ template <class Holder> bool takeAlpha(Holder const& holder, RGBAColor& working)
     unsigned short alpha = 0;
     if (!holder.GetAlphaColor(alpha))
         return false;
-    working.alpha = lowByte(alpha);
+    working.alpha = colorByte(alpha);
     return true;
 }
 

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuEdge.h"
-#include "contracts/tarvex/TarvexVisuFace.h"
-#include "contracts/tarvex/TarvexVisuPoints.h"
-#include "contracts/tarvex/TarvexVisuText.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdge.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFace.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPoints.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuText.h>
 
 #include <vector>
 

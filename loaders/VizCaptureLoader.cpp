@@ -1,14 +1,15 @@
-#include "loaders/VizCaptureLoader.h"
+#include <VizBridge/loaders/VizCaptureLoader.h>
 
-#include "contracts/kolba/VizCapture.h"
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexInstanceEntity.h"
-#include "contracts/tarvex/TarvexVisuCamera.h"
-#include "contracts/tarvex/TarvexVisuEntity.h"
-#include "contracts/tarvex/TarvexVisuIDIter.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCamera.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIDIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/TarvexValues.h>
 
 #include <vector>
 
@@ -31,7 +32,7 @@ VizCapture::CameraType toCameraType(TarvexVisuCamera::TarvexVisuCameraType const
 
 void addMembers(TarvexVisuIDIter& ids, VizCapture& capture) {
     while (ids.Next())
-        capture.AddMember(ids.Current().ToWString());
+        capture.AddMember(textOrEmpty(ids.Current()));
 }
 
 VizPort::WString bodyPath(TarvexEntity const& body) {
@@ -43,13 +44,13 @@ VizPort::WString bodyPath(TarvexEntity const& body) {
         if (current.GetPartEntity(partEntity)) {
             TarvexWString id;
             if (partEntity.GetID(id))
-                partId = id.ToWString();
+                partId = textOrEmpty(id);
             break;
         }
         TarvexInstanceEntity instanceEntity;
         if (!current.GetInstanceEntity(instanceEntity))
             break; // neither part nor instance: the names so far, without a part id
-        instanceNames.push_back(instanceEntity.GetInstance().GetInstanceName().ToWString());
+        instanceNames.push_back(textOrEmpty(instanceEntity.GetInstance().GetInstanceName()));
         current = instanceEntity.GetEntity();
     }
 
@@ -70,7 +71,7 @@ VizPort::WString bodyPath(TarvexEntity const& body) {
 VizCaptureLoader::VizCaptureLoader(TarvexVisuCapture const& source,
                                    std::vector<TarvexVisuAttributes>* attributes,
                                    bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizCaptureLoader::loadOne() {
     VizCapture* const capture = makeOne();
@@ -100,14 +101,14 @@ KolbaVizCore::VizElement* VizCaptureLoader::loadOne() {
             capture->SetOrthographicZoomFactor(camera.GetOrthographicZoomFactor());
     }
 
-    capture->SetName(m_source->GetDisplayName().ToWString());
+    capture->SetName(textOrEmpty(m_source->GetDisplayName()));
     TarvexWString id;
     if (m_source->GetID(id))
-        capture->SetVisualID(id.ToWString());
+        capture->SetVisualID(textOrEmpty(id));
     TarvexWString mechanicalId;
     if (m_source->GetMechanicalID(mechanicalId))
-        capture->SetMechanicalID(mechanicalId.ToWString());
-    capture->SetHiddenText(m_source->GetHiddenText().ToWString());
+        capture->SetMechanicalID(textOrEmpty(mechanicalId));
+    capture->SetHiddenText(textOrEmpty(m_source->GetHiddenText()));
 
     float origin[3] = {};
     float normal[3] = {};

@@ -1,8 +1,9 @@
 #pragma once
 
-#include "contracts/kolba/AVizCaptureLoader.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuCapture.h"
+#include <VizBridge/contracts/kolba/AVizCaptureLoader.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCapture.h>
+#include <VizBridge/loaders/VizSourceLoader.h>
 
 #include <vector>
 
@@ -13,11 +14,8 @@ namespace VizBridgeTarvex {
 /// constructed geometry, then, if it manages geometry, the paths of the bodies it shows: the names
 /// of the instances above a body, outermost first, each followed by "<KolbaSlash>" when there are
 /// two or more, and then the visual id of the part entity it ends in.
-///
-/// Points at its source without owning it; the source must outlive the loader. The attribute
-/// stack and the flag are kept like every loader's, but a capture reads neither. Owns
-/// nothing: the element it loads belongs to the caller of Load.
-class VizCaptureLoader : public KolbaVizCore::AVizCaptureLoader {
+class VizCaptureLoader
+    : public VizSourceLoader<KolbaVizCore::AVizCaptureLoader, TarvexVisuCapture> {
 public:
     VizCaptureLoader(TarvexVisuCapture const& source, std::vector<TarvexVisuAttributes>* attributes,
                      bool const& inheritAttributes);
@@ -25,11 +23,6 @@ public:
 
 protected:
     KolbaVizCore::VizElement* loadOne() override;
-
-private:
-    bool m_inheritAttributes;
-    std::vector<TarvexVisuAttributes>* m_attributes; ///< not owned, may be null, not read
-    TarvexVisuCapture const* m_source;               ///< not owned
 };
 
 } // namespace VizBridgeTarvex

@@ -1,10 +1,11 @@
-#include "loaders/VizEdgeLoader.h"
+#include <VizBridge/loaders/VizEdgeLoader.h>
 
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/tarvex/TarvexWString.h"
-#include "loaders/IndexedPoints.h"
-#include "loaders/VisuColor.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/IndexedPoints.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VisuColor.h>
 
 #include <cstddef>
 
@@ -32,7 +33,7 @@ VizEdge::EdgeType toEdgeType(TarvexVisuLineType const type) {
 VizEdgeLoader::VizEdgeLoader(TarvexVisuEdge const& source,
                              std::vector<TarvexVisuAttributes>* attributes,
                              bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizEdgeLoader::loadOne() {
     auto* const edge = dynamic_cast<VizEdge*>(makeOne());
@@ -41,7 +42,7 @@ KolbaVizCore::VizElement* VizEdgeLoader::loadOne() {
 
     TarvexWString mechanicalId;
     if (m_source->GetMechanicalID(mechanicalId))
-        edge->SetMechanicalID(mechanicalId.ToWString());
+        edge->SetMechanicalID(textOrEmpty(mechanicalId));
 
     float const* points = nullptr;
     int const pointFloats = m_source->GetPoints(points);

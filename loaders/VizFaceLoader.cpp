@@ -1,31 +1,25 @@
-#include "loaders/VizFaceLoader.h"
+#include <VizBridge/loaders/VizFaceLoader.h>
 
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/tarvex/TarvexVisuPolygonIter.h"
-#include "contracts/tarvex/TarvexWString.h"
-#include "loaders/LoadAs.h"
-#include "loaders/VisuColor.h"
-#include "loaders/VizPolygonLoader.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygonIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/HandOver.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VisuColor.h>
+#include <VizBridge/loaders/VizPolygonLoader.h>
 
 namespace VizBridgeTarvex {
 
 using KolbaVizCore::VizFace;
 using KolbaVizCore::VizPolygon;
 
-namespace {
-
-unsigned int countOf(int const count) {
-    return count > 0 ? static_cast<unsigned int>(count) : 0u;
-}
-
-} // namespace
-
 VizFaceLoader::VizFaceLoader(TarvexVisuFace const& source,
                              std::vector<TarvexVisuAttributes>* attributes,
                              bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizFaceLoader::loadOne() {
     auto* const face = dynamic_cast<VizFace*>(makeOne());
@@ -34,10 +28,10 @@ KolbaVizCore::VizElement* VizFaceLoader::loadOne() {
 
     TarvexWString id;
     if (m_source->GetID(id))
-        face->SetVisualID(id.ToWString());
+        face->SetVisualID(textOrEmpty(id));
     TarvexWString mechanicalId;
     if (m_source->GetMechanicalID(mechanicalId))
-        face->SetMechanicalID(mechanicalId.ToWString());
+        face->SetMechanicalID(textOrEmpty(mechanicalId));
 
     // A face always inherits: a mesh's faces show the colour of the nodes above them.
     KolbaVizCore::RGBAColor color;
@@ -47,17 +41,18 @@ KolbaVizCore::VizElement* VizFaceLoader::loadOne() {
     // The arrays belong to the source; the face keeps copies.
     float const* vertices = nullptr;
     int const vertexFloats = m_source->GetVertices(vertices);
-    face->SetVertices(countOf(vertexFloats), vertices);
+    face->SetVertices(countHint(vertexFloats), vertices);
     float const* normals = nullptr;
     int const normalFloats = m_source->GetNormals(normals);
-    face->SetNormals(countOf(normalFloats), normals);
+    face->SetNormals(countHint(normalFloats), normals);
 
     TarvexVisuPolygonIter polygons = m_source->GetPolygonIterator();
-    face->SetPolygonSizeHint(countOf(polygons.GetCount()));
+    face->SetPolygonSizeHint(countHint(polygons.GetCount()));
     while (polygons.Next()) {
         TarvexVisuPolygon const source = polygons.Current();
         VizPolygonLoader loader(source, m_attributes, m_inheritAttributes);
-        face->AddPolygon(loadAs<VizPolygon>(loader).release());
+        handOver(loadAs<VizPolygon>(loader),
+                 [face](VizPolygon* const polygon) { face->AddPolygon(polygon); });
     }
     return face;
 }

@@ -1,8 +1,9 @@
 #pragma once
 
-#include "contracts/kolba/AVizFaceLoader.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuFace.h"
+#include <VizBridge/contracts/kolba/AVizFaceLoader.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFace.h>
+#include <VizBridge/loaders/VizSourceLoader.h>
 
 #include <vector>
 
@@ -11,10 +12,7 @@ namespace VizBridgeTarvex {
 /// Loads one face: its visual and mechanical ids, its own colour (inheriting a missing colour or
 /// alpha from the attribute stack, always), its vertex and normal arrays (copied) and its
 /// polygons.
-///
-/// Points at its source and at the attribute stack without owning either; both must outlive
-/// the loader. Owns nothing: the element it loads belongs to the caller of Load.
-class VizFaceLoader : public KolbaVizCore::AVizFaceLoader {
+class VizFaceLoader : public VizSourceLoader<KolbaVizCore::AVizFaceLoader, TarvexVisuFace> {
 public:
     /// `attributes` may be null. `inheritAttributes` is only handed on to the polygons: the
     /// face's own colour inherits from the stack whatever the flag says.
@@ -24,11 +22,6 @@ public:
 
 protected:
     KolbaVizCore::VizElement* loadOne() override;
-
-private:
-    bool m_inheritAttributes;
-    std::vector<TarvexVisuAttributes>* m_attributes;
-    TarvexVisuFace const* m_source;
 };
 
 } // namespace VizBridgeTarvex

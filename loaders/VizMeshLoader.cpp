@@ -1,14 +1,16 @@
-#include "loaders/VizMeshLoader.h"
+#include <VizBridge/loaders/VizMeshLoader.h>
 
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuFaceIter.h"
-#include "contracts/tarvex/TarvexWString.h"
-#include "loaders/LoadAs.h"
-#include "loaders/VizEdgeLoader.h"
-#include "loaders/VizFaceLoader.h"
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFaceIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/HandOver.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VizEdgeLoader.h>
+#include <VizBridge/loaders/VizFaceLoader.h>
 
 namespace VizBridgeTarvex {
 
@@ -16,18 +18,10 @@ using KolbaVizCore::VizEdge;
 using KolbaVizCore::VizFace;
 using KolbaVizCore::VizMesh;
 
-namespace {
-
-unsigned int countOf(int const count) {
-    return count > 0 ? static_cast<unsigned int>(count) : 0u;
-}
-
-} // namespace
-
 VizMeshLoader::VizMeshLoader(TarvexVisuMesh const& source,
                              std::vector<TarvexVisuAttributes>* attributes,
                              bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizMeshLoader::loadOne() {
     auto* const mesh = dynamic_cast<VizMesh*>(makeOne());
@@ -36,25 +30,25 @@ KolbaVizCore::VizElement* VizMeshLoader::loadOne() {
 
     TarvexWString id;
     if (m_source->GetID(id))
-        mesh->SetVisualID(id.ToWString());
+        mesh->SetVisualID(textOrEmpty(id));
     TarvexWString mechanicalId;
     if (m_source->GetMechanicalID(mechanicalId))
-        mesh->SetMechanicalID(mechanicalId.ToWString());
+        mesh->SetMechanicalID(textOrEmpty(mechanicalId));
 
     TarvexVisuFaceIter faces = m_source->GetFaceIterator();
-    mesh->SetFaceCountHint(countOf(faces.GetCount()));
+    mesh->SetFaceCountHint(countHint(faces.GetCount()));
     while (faces.Next()) {
         TarvexVisuFace const source = faces.Current();
         VizFaceLoader loader(source, m_attributes, m_inheritAttributes);
-        mesh->AddFace(loadAs<VizFace>(loader).release());
+        handOver(loadAs<VizFace>(loader), [mesh](VizFace* const face) { mesh->AddFace(face); });
     }
 
     TarvexVisuEdgeIter edges = m_source->GetEdgeIterator();
-    mesh->SetEdgeCountHint(countOf(edges.GetCount()));
+    mesh->SetEdgeCountHint(countHint(edges.GetCount()));
     while (edges.Next()) {
         TarvexVisuEdge const source = edges.Current();
         VizEdgeLoader loader(source, m_attributes, m_inheritAttributes);
-        mesh->AddEdge(loadAs<VizEdge>(loader).release());
+        handOver(loadAs<VizEdge>(loader), [mesh](VizEdge* const edge) { mesh->AddEdge(edge); });
     }
     return mesh;
 }

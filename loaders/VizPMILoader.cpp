@@ -1,28 +1,29 @@
-#include "loaders/VizPMILoader.h"
+#include <VizBridge/loaders/VizPMILoader.h>
 
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPMIType.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexVisuEdge.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuEntity.h"
-#include "contracts/tarvex/TarvexVisuFont.h"
-#include "contracts/tarvex/TarvexVisuText.h"
-#include "contracts/tarvex/TarvexVisuTextIter.h"
-#include "contracts/tarvex/TarvexWString.h"
-#include "loaders/LoadAs.h"
-#include "loaders/PMITypeMapping.h"
-#include "loaders/VizEdgeLoader.h"
-#include "loaders/VizTextLoader.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPMIType.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdge.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuText.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuTextIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/HandOver.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/PMITypeMapping.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VizEdgeLoader.h>
+#include <VizBridge/loaders/VizTextLoader.h>
 
 #include <memory>
-#include <utility>
 
 namespace VizBridgeTarvex {
 
@@ -34,40 +35,11 @@ using KolbaVizCore::VizText;
 
 namespace {
 
-unsigned int countOf(int const count) {
-    return count > 0 ? static_cast<unsigned int>(count) : 0u;
-}
-
 VizPMIType pmiTypeOf(TarvexVisuNode::TarvexVisuNodeType const nodeType) {
     VizPMIType::ID const id = GetVizPMITypeFromVisuNodeType(nodeType);
     return VizPMIType(id, TarvexVisuNode::NodeTypeAsString(nodeType),
                       GetEntityTypeFromVizPMIType(id));
 }
-
-/// The pieces of one tessellated text, which cross from tesselateText as raw pointers: freed
-/// here unless handed on, also when handing them on fails halfway.
-template <class Piece> class TextPieces {
-public:
-    TextPieces() = default;
-    TextPieces(TextPieces const&) = delete;
-    TextPieces& operator=(TextPieces const&) = delete;
-    ~TextPieces() {
-        for (Piece* const piece : m_items)
-            std::unique_ptr<Piece> const released(piece);
-    }
-
-    std::vector<Piece*>& Items() { return m_items; }
-
-    /// Gives every piece, in order, to `add`, which takes it over.
-    template <class Add> void HandOver(Add const& add) {
-        for (Piece*& piece : m_items)
-            add(std::exchange(piece, nullptr));
-        m_items.clear();
-    }
-
-private:
-    std::vector<Piece*> m_items; ///< owned
-};
 
 } // namespace
 
@@ -92,13 +64,13 @@ KolbaVizCore::VizElement* VizPMILoader::loadOne() {
     if (pmi->GetEdges().empty() && pmi->GetFaces().empty() && pmi->GetTexts().empty())
         return nullptr;
 
-    pmi->SetName(m_source->GetDisplayName().ToWString());
+    pmi->SetName(textOrEmpty(m_source->GetDisplayName()));
     TarvexWString id;
     if (m_source->GetID(id))
-        pmi->SetVisualID(id.ToWString());
+        pmi->SetVisualID(textOrEmpty(id));
     TarvexWString mechanicalId;
     if (m_source->GetMechanicalID(mechanicalId))
-        pmi->SetMechanicalID(mechanicalId.ToWString());
+        pmi->SetMechanicalID(textOrEmpty(mechanicalId));
     loadLinkedEntityIDs(*pmi);
     // Only ever hides: the node's own attributes may still show it afterwards.
     if (isHiddenByStack())
@@ -108,21 +80,21 @@ KolbaVizCore::VizElement* VizPMILoader::loadOne() {
 
 void VizPMILoader::loadEdges(VizPMI& pmi) const {
     TarvexVisuEdgeIter edges = m_source->GetEdgeIterator();
-    pmi.SetEdgeCountHint(countOf(edges.GetCount()));
+    pmi.SetEdgeCountHint(countHint(edges.GetCount()));
     while (edges.Next()) {
         TarvexVisuEdge const source = edges.Current();
         VizEdgeLoader loader(source, m_attributes, true);
         if (std::unique_ptr<VizEdge> edge = loadAs<VizEdge>(loader)) {
             // PMI is drawn opaque.
             edge->RemoveTransparency();
-            pmi.AddEdge(edge.release());
+            handOver(std::move(edge), [&pmi](VizEdge* const piece) { pmi.AddEdge(piece); });
         }
     }
 }
 
 void VizPMILoader::loadTexts(VizPMI& pmi) const {
     TarvexVisuTextIter texts = m_source->GetTextIterator();
-    pmi.SetTextCountHint(countOf(texts.GetCount()));
+    pmi.SetTextCountHint(countHint(texts.GetCount()));
     while (texts.Next()) {
         TarvexVisuText const source = texts.Current();
         VizTextLoader loader(source, m_attributes, true);
@@ -132,8 +104,9 @@ void VizPMILoader::loadTexts(VizPMI& pmi) const {
         text->RemoveTransparency();
         if (text->GetText().empty())
             continue;
+        auto const addText = [&pmi](VizText* const piece) { pmi.AddText(piece); };
         if (!m_tesselateText) {
-            pmi.AddText(text.release());
+            handOver(std::move(text), addText);
             continue;
         }
 
@@ -141,17 +114,20 @@ void VizPMILoader::loadTexts(VizPMI& pmi) const {
         TarvexVisuFont font;
         if (m_attributes != nullptr)
             findInheritedFont(m_attributes, font);
-        TextPieces<VizEdge> strokes;
-        TextPieces<VizFace> shapes;
-        if (tesselateText(source, font, m_attributes, strokes.Items(), shapes.Items())) {
-            strokes.HandOver([&pmi](VizEdge* const edge) { pmi.AddEdge(edge); });
-            shapes.HandOver([&pmi](VizFace* const face) { pmi.AddFace(face); });
+        std::vector<VizEdge*> strokes;
+        std::vector<VizFace*> shapes;
+        if (tesselateText(source, font, m_attributes, strokes, shapes)) {
+            // Taken over before anything else can throw.
+            std::vector<std::unique_ptr<VizEdge>> ownedStrokes = adoptAll(strokes);
+            std::vector<std::unique_ptr<VizFace>> ownedShapes = adoptAll(shapes);
+            handOverAll(ownedStrokes, [&pmi](VizEdge* const edge) { pmi.AddEdge(edge); });
+            handOverAll(ownedShapes, [&pmi](VizFace* const face) { pmi.AddFace(face); });
             continue; // the geometry stands for the text, which goes
         }
         // Shown in the text's place, so that a reader sees that something is missing.
         text->SetText(u"Failed to Tesselate Text!");
         text->SetColor(KolbaVizCore::RGBAColor(255, 255, 0, 255));
-        pmi.AddText(text.release());
+        handOver(std::move(text), addText);
     }
 }
 
@@ -164,7 +140,7 @@ void VizPMILoader::loadLinkedEntityIDs(VizPMI& pmi) const {
         TarvexVisuEntity partEntity;
         TarvexWString id;
         if (entity.GetPartEntity(partEntity) && partEntity.GetID(id))
-            ids.push_back(id.ToWString());
+            ids.push_back(textOrEmpty(id));
     }
     pmi.SetLinkedEntityIDs(ids);
 }

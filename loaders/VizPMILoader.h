@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/kolba/AVizPMILoader.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuNode.h"
-#include "contracts/tarvex/TarvexVisuPMI.h"
+#include <VizBridge/contracts/kolba/AVizPMILoader.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPMI.h>
 
 #include <vector>
 

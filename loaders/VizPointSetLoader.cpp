@@ -1,10 +1,12 @@
-#include "loaders/VizPointSetLoader.h"
+#include <VizBridge/loaders/VizPointSetLoader.h>
 
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizPoints.h"
-#include "contracts/tarvex/TarvexVisuPointsIter.h"
-#include "loaders/LoadAs.h"
-#include "loaders/VizPointsLoader.h"
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPointsIter.h>
+#include <VizBridge/loaders/HandOver.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VizPointsLoader.h>
 
 namespace VizBridgeTarvex {
 
@@ -14,7 +16,7 @@ using KolbaVizCore::VizPointSet;
 VizPointSetLoader::VizPointSetLoader(TarvexVisuPointSet const& source,
                                      std::vector<TarvexVisuAttributes>* attributes,
                                      bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizPointSetLoader::loadOne() {
     auto* const pointSet = dynamic_cast<VizPointSet*>(makeOne());
@@ -23,12 +25,13 @@ KolbaVizCore::VizElement* VizPointSetLoader::loadOne() {
 
     TarvexVisuPointsIter groups = m_source->GetPointsIterator();
     int const count = groups.GetCount();
-    pointSet->SetPointsCountHint(count > 0 ? static_cast<unsigned int>(count) : 0u);
+    pointSet->SetPointsCountHint(countHint(count));
     while (groups.Next()) {
         TarvexVisuPoints const source = groups.Current();
         // The set carries no colour of its own here, so its points always look up the stack.
         VizPointsLoader loader(source, m_attributes, true);
-        pointSet->AddPoints(loadAs<VizPoints>(loader).release());
+        handOver(loadAs<VizPoints>(loader),
+                 [pointSet](VizPoints* const points) { pointSet->AddPoints(points); });
     }
     return pointSet;
 }

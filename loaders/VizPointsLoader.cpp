@@ -1,9 +1,9 @@
-#include "loaders/VizPointsLoader.h"
+#include <VizBridge/loaders/VizPointsLoader.h>
 
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/VizPoints.h"
-#include "loaders/IndexedPoints.h"
-#include "loaders/VisuColor.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/loaders/IndexedPoints.h>
+#include <VizBridge/loaders/VisuColor.h>
 
 #include <cstddef>
 
@@ -14,7 +14,7 @@ using KolbaVizCore::VizPoints;
 VizPointsLoader::VizPointsLoader(TarvexVisuPoints const& source,
                                  std::vector<TarvexVisuAttributes>* attributes,
                                  bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizPointsLoader::loadOne() {
     auto* const points = dynamic_cast<VizPoints*>(makeOne());

@@ -1,7 +1,8 @@
-#include "loaders/VizPolygonLoader.h"
+#include <VizBridge/loaders/VizPolygonLoader.h>
 
-#include "contracts/kolba/TriangleType.h"
-#include "contracts/kolba/VizPolygon.h"
+#include <VizBridge/contracts/kolba/TriangleType.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/loaders/TarvexValues.h>
 
 namespace VizBridgeTarvex {
 
@@ -27,7 +28,7 @@ KolbaVizCore::TriangleType toTriangleType(TarvexVisuPolygonType const type) {
 VizPolygonLoader::VizPolygonLoader(TarvexVisuPolygon const& source,
                                    std::vector<TarvexVisuAttributes>* attributes,
                                    bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizPolygonLoader::loadOne() {
     auto* const polygon = dynamic_cast<VizPolygon*>(makeOne());
@@ -39,7 +40,7 @@ KolbaVizCore::VizElement* VizPolygonLoader::loadOne() {
     int const count = m_source->GetPolygonIndices(indices, type);
     // The indices stay offsets into the face's arrays: the renderer resolves them there. A
     // polygon without indices is kept, with none.
-    polygon->SetIndices(count > 0 ? static_cast<unsigned int>(count) : 0u, indices);
+    polygon->SetIndices(countHint(count), indices);
     polygon->SetPolygonType(toTriangleType(type));
     return polygon;
 }

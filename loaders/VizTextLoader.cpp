@@ -1,18 +1,22 @@
-#include "loaders/VizTextLoader.h"
+#include <VizBridge/loaders/VizTextLoader.h>
 
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/tarvex/TarvexVisu2DTextBuilder.h"
-#include "contracts/tarvex/TarvexVisuEdge.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuFace.h"
-#include "contracts/tarvex/TarvexVisuFaceIter.h"
-#include "contracts/tarvex/TarvexWString.h"
-#include "loaders/LoadAs.h"
-#include "loaders/VisuColor.h"
-#include "loaders/VizEdgeLoader.h"
-#include "loaders/VizFaceLoader.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/platform/DebugOutput.h>
+#include <VizBridge/contracts/platform/FormatW.h>
+#include <VizBridge/contracts/tarvex/TarvexVisu2DTextBuilder.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdge.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFace.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFaceIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VisuColor.h>
+#include <VizBridge/loaders/VizEdgeLoader.h>
+#include <VizBridge/loaders/VizFaceLoader.h>
 
+#include <exception>
 #include <memory>
 
 namespace VizBridgeTarvex {
@@ -23,18 +27,10 @@ using KolbaVizCore::VizText;
 
 namespace {
 
-/// Appends what `piece` holds to `pieces`, which takes it over; a null piece is left out.
-template <class Piece> void appendPiece(std::unique_ptr<Piece> piece, std::vector<Piece*>& pieces) {
-    if (!piece)
-        return;
-    pieces.push_back(piece.get()); // may throw: `piece` still frees it then
-    static_cast<void>(piece.release());
-}
-
-template <class Piece> void freePieces(std::vector<Piece*>& pieces) {
-    for (Piece* const piece : pieces)
-        std::unique_ptr<Piece> const released(piece); // the pieces were never handed out
-    pieces.clear();
+void reportTessellationFailure(VizPort::WString const& reason) {
+    VizPort::WString const text =
+        VizPort::FormatW(512, u"Failed to Tesselate Text: %s", {reason.c_str()});
+    VizPort::OutputDebugStringW(text.c_str());
 }
 
 } // namespace
@@ -42,7 +38,7 @@ template <class Piece> void freePieces(std::vector<Piece*>& pieces) {
 VizTextLoader::VizTextLoader(TarvexVisuText const& source,
                              std::vector<TarvexVisuAttributes>* attributes,
                              bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizTextLoader::loadOne() {
     auto* const text = dynamic_cast<VizText*>(makeOne());
@@ -58,7 +54,7 @@ KolbaVizCore::VizElement* VizTextLoader::loadOne() {
     if (!m_source->GetFont(font) && m_attributes != nullptr)
         findInheritedFont(m_attributes, font);
     // A default font gives its name too: the renderer picks its own face for an empty one.
-    text->SetFontName(font.GetFontName().ToWString());
+    text->SetFontName(textOrEmpty(font.GetFontName()));
     // The getters leave the 1.0 in place when the font lacks the value.
     float height = 1.0f;
     font.GetTextHeight(height);
@@ -74,7 +70,7 @@ KolbaVizCore::VizElement* VizTextLoader::loadOne() {
     float direction[3] = {1.0f, 0.0f, 0.0f};
     float normal[3] = {0.0f, 0.0f, 1.0f};
     TarvexWString const string = m_source->GetTextString(anchor, direction, normal);
-    text->SetText(string.ToWString());
+    text->SetText(textOrEmpty(string));
     text->SetAnchorPoint(anchor);
     text->SetDirection(direction);
     text->SetNormal(normal);
@@ -102,40 +98,49 @@ bool tesselateText(TarvexVisuText const& source, TarvexVisuFont const& font,
 bool tesselateText(std::function<TarvexVisuBuild2DTextResult()> const& build,
                    std::vector<TarvexVisuAttributes>* attributes, std::vector<VizEdge*>& edges,
                    std::vector<VizFace*>& faces) {
-    bool made = false;
+    // Held here until the whole text is made: half a text is not shown.
+    std::vector<std::unique_ptr<VizEdge>> strokes;
+    std::vector<std::unique_ptr<VizFace>> shapes;
     // The caller shows a notice in place of a text that could not become geometry, so a
-    // failure of any kind, even one no std::exception describes, ends here.
+    // failure of any kind, even one no std::exception describes, ends here; the reason goes
+    // to the debug output, where a host that set up the text builder wrongly finds it.
     try {
         TarvexVisuBuild2DTextResult const built = build();
 
-        TarvexVisuEdgeIter strokes = built.GetStrokedFontTextIterator();
-        while (strokes.Next()) {
-            TarvexVisuEdge const stroke = strokes.Current();
+        TarvexVisuEdgeIter strokeSources = built.GetStrokedFontTextIterator();
+        while (strokeSources.Next()) {
+            TarvexVisuEdge const stroke = strokeSources.Current();
             VizEdgeLoader loader(stroke, attributes, true);
-            std::unique_ptr<VizEdge> edge = loadAs<VizEdge>(loader);
-            // PMI lines are drawn opaque, the strokes of its texts too.
-            if (edge)
-                edge->RemoveTransparency();
-            appendPiece(std::move(edge), edges);
+            if (std::unique_ptr<VizEdge> edge = loadAs<VizEdge>(loader)) {
+                edge->RemoveTransparency(); // PMI lines are drawn opaque, its texts' too
+                strokes.push_back(std::move(edge));
+            }
         }
 
-        TarvexVisuFaceIter filled = built.GetFilledFontTextIterator();
-        while (filled.Next()) {
-            TarvexVisuFace const shape = filled.Current();
+        TarvexVisuFaceIter shapeSources = built.GetFilledFontTextIterator();
+        while (shapeSources.Next()) {
+            TarvexVisuFace const shape = shapeSources.Current();
             VizFaceLoader loader(shape, attributes, true);
-            appendPiece(loadAs<VizFace>(loader), faces);
+            if (std::unique_ptr<VizFace> face = loadAs<VizFace>(loader))
+                shapes.push_back(std::move(face));
         }
-
-        made = !edges.empty() || !faces.empty();
+        edges.reserve(strokes.size());
+        faces.reserve(shapes.size());
+    } catch (std::exception const& e) {
+        reportTessellationFailure(VizPort::Widen(e.what() ? e.what() : ""));
+        return false;
     } catch (...) {
-        made = false;
+        reportTessellationFailure(u"unknown exception");
+        return false;
     }
-    // Half a text is not shown: what was made before a failure goes.
-    if (!made) {
-        freePieces(edges);
-        freePieces(faces);
-    }
-    return made;
+    if (strokes.empty() && shapes.empty())
+        return false;
+    // Reserved above: handing the pieces across cannot fail.
+    for (std::unique_ptr<VizEdge>& edge : strokes)
+        edges.push_back(edge.release());
+    for (std::unique_ptr<VizFace>& face : shapes)
+        faces.push_back(face.release());
+    return true;
 }
 
 } // namespace VizBridgeTarvex

@@ -1,12 +1,13 @@
 #pragma once
 
-#include "contracts/kolba/AVizTextLoader.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuBuild2DTextResult.h"
-#include "contracts/tarvex/TarvexVisuFont.h"
-#include "contracts/tarvex/TarvexVisuText.h"
+#include <VizBridge/contracts/kolba/AVizTextLoader.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuBuild2DTextResult.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuText.h>
+#include <VizBridge/loaders/VizSourceLoader.h>
 
 #include <functional>
 #include <vector>
@@ -17,10 +18,7 @@ namespace VizBridgeTarvex {
 /// up in the stack), its font (its own, else the nearest of the stack, else a default one),
 /// the font's size, spacing and width scaling (1 where the font has none, unscaled), the
 /// string, and where it stands.
-///
-/// Points at its source and at the attribute stack without owning either; both must outlive
-/// the loader. Owns nothing: the element it loads belongs to the caller of Load.
-class VizTextLoader : public KolbaVizCore::AVizTextLoader {
+class VizTextLoader : public VizSourceLoader<KolbaVizCore::AVizTextLoader, TarvexVisuText> {
 public:
     /// `attributes` may be null. `inheritAttributes` is kept like every loader's flag, but a
     /// text inherits its colour and font from the stack whatever it says.
@@ -30,11 +28,6 @@ public:
 
 protected:
     KolbaVizCore::VizElement* loadOne() override;
-
-private:
-    bool m_inheritAttributes;
-    std::vector<TarvexVisuAttributes>* m_attributes; ///< not owned, may be null
-    TarvexVisuText const* m_source;                  ///< not owned
 };
 
 /// Fills `font` from the newest entry of the attribute stack that has a font, and answers
@@ -46,7 +39,8 @@ bool findInheritedFont(std::vector<TarvexVisuAttributes> const* attributes, Tarv
 /// least one piece was made. `edges` and `faces` must come in empty. On true they hold the
 /// pieces, which cross to the caller, who must free or hand on each; on false they are empty
 /// again. Never throws: a failure of the builder or of a loader, of any kind, counts as no
-/// geometry, and every piece made before it is freed.
+/// geometry, every piece made before it is freed, and the reason goes to the debug output as
+/// "Failed to Tesselate Text: <reason>".
 bool tesselateText(TarvexVisuText const& source, TarvexVisuFont const& font,
                    std::vector<TarvexVisuAttributes>* attributes,
                    std::vector<KolbaVizCore::VizEdge*>& edges,

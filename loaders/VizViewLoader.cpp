@@ -1,8 +1,9 @@
-#include "loaders/VizViewLoader.h"
+#include <VizBridge/loaders/VizViewLoader.h>
 
-#include "contracts/kolba/VizView.h"
-#include "contracts/tarvex/TarvexVisuIDIter.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIDIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/TarvexValues.h>
 
 namespace VizBridgeTarvex {
 
@@ -11,7 +12,7 @@ using KolbaVizCore::VizView;
 VizViewLoader::VizViewLoader(TarvexVisuView const& source,
                              std::vector<TarvexVisuAttributes>* attributes,
                              bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizViewLoader::loadOne() {
     auto* const view = dynamic_cast<VizView*>(makeOne());
@@ -22,13 +23,13 @@ KolbaVizCore::VizElement* VizViewLoader::loadOne() {
     bool hidden = false;
     if (m_source->GetHidden(hidden))
         view->SetHidden(hidden);
-    view->SetName(m_source->GetDisplayName().ToWString());
+    view->SetName(textOrEmpty(m_source->GetDisplayName()));
     TarvexWString id;
     if (m_source->GetID(id))
-        view->SetVisualID(id.ToWString());
+        view->SetVisualID(textOrEmpty(id));
     TarvexWString mechanicalId;
     if (m_source->GetMechanicalID(mechanicalId))
-        view->SetMechanicalID(mechanicalId.ToWString());
+        view->SetMechanicalID(textOrEmpty(mechanicalId));
 
     float origin[3] = {};
     float first[3] = {};
@@ -39,7 +40,7 @@ KolbaVizCore::VizElement* VizViewLoader::loadOne() {
     TarvexVisuIDIter annotations = m_source->GetAnnotationIDIterator();
     view->SetMemberCountHint(annotations.GetCount());
     while (annotations.Next())
-        view->AddMember(annotations.Current().ToWString());
+        view->AddMember(textOrEmpty(annotations.Current()));
     return view;
 }
 

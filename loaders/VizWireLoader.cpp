@@ -1,11 +1,13 @@
-#include "loaders/VizWireLoader.h"
+#include <VizBridge/loaders/VizWireLoader.h>
 
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexWString.h"
-#include "loaders/LoadAs.h"
-#include "loaders/VizEdgeLoader.h"
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
+#include <VizBridge/loaders/HandOver.h>
+#include <VizBridge/loaders/LoadAs.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/loaders/VizEdgeLoader.h>
 
 namespace VizBridgeTarvex {
 
@@ -15,7 +17,7 @@ using KolbaVizCore::VizWire;
 VizWireLoader::VizWireLoader(TarvexVisuWire const& source,
                              std::vector<TarvexVisuAttributes>* attributes,
                              bool const& inheritAttributes)
-    : m_inheritAttributes(inheritAttributes), m_attributes(attributes), m_source(&source) {}
+    : VizSourceLoader(source, attributes, inheritAttributes) {}
 
 KolbaVizCore::VizElement* VizWireLoader::loadOne() {
     auto* const wire = dynamic_cast<VizWire*>(makeOne());
@@ -24,16 +26,16 @@ KolbaVizCore::VizElement* VizWireLoader::loadOne() {
 
     TarvexWString id;
     if (m_source->GetID(id))
-        wire->SetVisualID(id.ToWString());
+        wire->SetVisualID(textOrEmpty(id));
 
     TarvexVisuEdgeIter edges = m_source->GetEdgeIterator();
     int const count = edges.GetCount();
-    wire->SetEdgeCountHint(count > 0 ? static_cast<unsigned int>(count) : 0u);
+    wire->SetEdgeCountHint(countHint(count));
     while (edges.Next()) {
         TarvexVisuEdge const source = edges.Current();
         // The wire carries no colour of its own here, so its edges always look up the stack.
         VizEdgeLoader loader(source, m_attributes, true);
-        wire->AddEdge(loadAs<VizEdge>(loader).release());
+        handOver(loadAs<VizEdge>(loader), [wire](VizEdge* const edge) { wire->AddEdge(edge); });
     }
     return wire;
 }

@@ -1,6 +1,6 @@
-#include "model/VizPSEntry.h"
+#include <VizBridge/model/VizPSEntry.h>
 
-#include "model/VizProductStructure.h"
+#include <VizBridge/model/VizProductStructure.h>
 
 namespace VizBridgeTarvex {
 
@@ -8,11 +8,6 @@ VizPSEntry::VizPSEntry(unsigned long const& id, WString const& referenceName,
                        WString const& instanceName, bool const& isPart)
     : m_referenceName(referenceName), m_instanceName(instanceName), m_isPart(isPart) {
     setID(id);
-}
-
-VizPSEntry::~VizPSEntry() {
-    // The children belong to the product structure, which deletes every entry itself.
-    m_children.clear();
 }
 
 VizContainer* VizPSEntry::GetVizContainer() const {

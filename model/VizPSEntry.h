@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/VizTypes.h"
+#include <VizBridge/model/VizTypes.h>
 
 #include <string>
 #include <vector>
@@ -16,10 +16,11 @@ class VizProductStructure;
 /// which deletes it. It points at its children and its structure without owning them.
 class VizPSEntry : public VizElement {
 public:
+    /// Member-wise: a copy points at the same children and the same structure.
     VizPSEntry(VizPSEntry const&) = default;
     VizPSEntry& operator=(VizPSEntry const&) = default;
-    /// Does not delete the children: the product structure deletes every entry itself.
-    ~VizPSEntry() override;
+    /// Leaves the children alone: the product structure deletes every entry itself.
+    ~VizPSEntry() override = default;
 
     std::string const GetElementType() const override { return "VizPSEntry"; }
 
@@ -59,13 +60,14 @@ public:
 
 private:
     friend class VizPSInstanceBuilder;
+    friend class VizProductStructure; // re-points the children of the entries it copies
     VizPSEntry(unsigned long const& id, WString const& referenceName, WString const& instanceName,
                bool const& isPart);
 
     WString m_referenceName;
     WString m_instanceName;
     bool m_isPart;
-    std::vector<VizPSEntry*> m_children;               ///< not owned
+    std::vector<VizPSEntry*> m_children;               ///< not owned: the structure's
     VizProductStructure* m_productStructure = nullptr; ///< not owned: the owner of this entry
     bool m_hasAlpha = false;
     bool m_hidden = false;

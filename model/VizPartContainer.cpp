@@ -1,4 +1,4 @@
-#include "model/VizPartContainer.h"
+#include <VizBridge/model/VizPartContainer.h>
 
 namespace VizBridgeTarvex {
 

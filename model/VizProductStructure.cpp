@@ -1,8 +1,10 @@
-#include "model/VizProductStructure.h"
+#include <VizBridge/model/VizProductStructure.h>
 
-#include "model/VizOwnedObjects.h"
-#include "model/VizPSEntry.h"
-#include "model/VizPartContainer.h"
+#include <VizBridge/model/VizContainerStore.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizPartContainer.h>
+
+#include <unordered_map>
 
 namespace VizBridgeTarvex {
 
@@ -12,50 +14,119 @@ Container* findValue(std::map<int, Container*> const& map, int const& id) {
     auto const found = map.find(id);
     return found == map.end() ? nullptr : found->second;
 }
-
-/// Erases the first pair, in key order, whose value is `container`.
-template <typename Container>
-bool eraseFirst(std::map<int, Container*>& map, Container const* container) {
-    for (auto it = map.begin(); it != map.end(); ++it) {
-        if (it->second == container) {
-            map.erase(it);
-            return true;
-        }
-    }
-    return false;
-}
 } // namespace
 
 VizProductStructure::VizProductStructure(char16_t const* name)
-    : m_owned(std::make_shared<VizOwnedObjects>()) {
+    : m_containers(std::make_shared<VizContainerStore>()) {
     productName = name ? WString(name) : WString();
 }
 
-VizProductStructure::VizProductStructure(VizProductStructure const&) = default;
-VizProductStructure& VizProductStructure::operator=(VizProductStructure const&) = default;
-// The owned objects go with the last copy, in the order VizOwnedObjects keeps.
+VizProductStructure::VizProductStructure(VizProductStructure const& other)
+    : VizDocumentInfo(other), m_configurationName(other.m_configurationName),
+      m_units(other.m_units), m_containerCount(other.m_containerCount),
+      m_allBREPLoaded(other.m_allBREPLoaded), m_allVizLoaded(other.m_allVizLoaded),
+      m_tesselatingText(other.m_tesselatingText), m_missingFiles(other.m_missingFiles),
+      m_missingReferences(other.m_missingReferences), m_importErrors(other.m_importErrors),
+      m_visuErrors(other.m_visuErrors), m_containers(other.m_containers) {
+    copyEntries(other);
+}
+
+VizProductStructure& VizProductStructure::operator=(VizProductStructure const& other) {
+    if (this == &other)
+        return *this;
+    copyEntries(other); // first: it may throw, and then this structure stays as it was
+    static_cast<VizDocumentInfo&>(*this) = other;
+    m_configurationName = other.m_configurationName;
+    m_units = other.m_units;
+    m_containerCount = other.m_containerCount;
+    m_allBREPLoaded = other.m_allBREPLoaded;
+    m_allVizLoaded = other.m_allVizLoaded;
+    m_tesselatingText = other.m_tesselatingText;
+    m_missingFiles = other.m_missingFiles;
+    m_missingReferences = other.m_missingReferences;
+    m_importErrors = other.m_importErrors;
+    m_visuErrors = other.m_visuErrors;
+    m_containers = other.m_containers;
+    return *this;
+}
+
+// The containers go first (m_containers is the last member), then the entries.
 VizProductStructure::~VizProductStructure() = default;
+
+void VizProductStructure::copyEntries(VizProductStructure const& other) {
+    std::unordered_map<VizPSEntry const*, VizPSEntry*> copies;
+    std::multimap<int, std::unique_ptr<VizPSEntry>> entries;
+    for (auto const& [id, entry] : other.m_subAssemblies) {
+        auto copy = std::make_unique<VizPSEntry>(*entry);
+        copy->SetProductStructure(this);
+        copies.emplace(entry.get(), copy.get());
+        entries.emplace(id, std::move(copy));
+    }
+    // An entry stands in the map once, so every child and root has its copy.
+    auto const copyOf = [&copies](VizPSEntry* entry) {
+        auto const found = copies.find(entry);
+        return found == copies.end() ? entry : found->second;
+    };
+    for (auto& [id, entry] : entries) {
+        for (VizPSEntry*& child : entry->m_children)
+            child = copyOf(child);
+    }
+    std::vector<VizPSEntry*> roots;
+    roots.reserve(other.m_rootEntries.size());
+    for (VizPSEntry* const root : other.m_rootEntries)
+        roots.push_back(copyOf(root));
+    m_subAssemblies.swap(entries);
+    m_rootEntries.swap(roots);
+}
 
 VizPSEntry* VizProductStructure::GetSubAssembly(int const& id) const {
     // lower_bound, not find: with several instances the first one built must answer.
     auto const first = m_subAssemblies.lower_bound(id);
-    return first != m_subAssemblies.end() && first->first == id ? first->second : nullptr;
+    return first != m_subAssemblies.end() && first->first == id ? first->second.get() : nullptr;
+}
+
+std::map<int, VizPartContainer*> const& VizProductStructure::GetAllVizPartContainers() const {
+    return m_containers->Parts();
+}
+
+std::map<int, VizContainer*> const& VizProductStructure::GetAllVizContainers() const {
+    return m_containers->Geometry();
+}
+
+std::map<int, VizPMIContainer*> const& VizProductStructure::GetAllVizPMIContainers() const {
+    return m_containers->PMI();
 }
 
 VizPartContainer* VizProductStructure::GetVizPartContainer(int const& id) const {
-    return findValue(m_vizPartContainers, id);
+    return findValue(m_containers->Parts(), id);
 }
 
 VizContainer* VizProductStructure::GetVizContainer(int const& id) const {
-    return findValue(m_vizContainers, id);
+    return findValue(m_containers->Geometry(), id);
 }
 
 VizPMIContainer* VizProductStructure::GetVizPMIContainer(int const& id) const {
-    return findValue(m_vizPMIContainers, id);
+    return findValue(m_containers->PMI(), id);
+}
+
+int VizProductStructure::GetNumberOfVizPartContainers() const {
+    return static_cast<int>(m_containers->Parts().size());
+}
+
+int VizProductStructure::GetNumberOfVizContainers() const {
+    return static_cast<int>(m_containers->Geometry().size());
+}
+
+int VizProductStructure::GetNumberOfVizPMIContainers() const {
+    return static_cast<int>(m_containers->PMI().size());
 }
 
 bool VizProductStructure::IsVizLoaded(int const& id) const {
-    return m_vizContainers.count(id) != 0 || m_vizPMIContainers.count(id) != 0;
+    return m_containers->Geometry().count(id) != 0 || m_containers->PMI().count(id) != 0;
+}
+
+bool VizProductStructure::IsBREPLoaded(int const& id) const {
+    return m_containers->Parts().count(id) != 0;
 }
 
 bool VizProductStructure::IsSemanticInfoLoaded(int const& id) const {
@@ -84,7 +155,7 @@ std::vector<WString> VizProductStructure::GetErrorMessages() const {
 }
 
 bool VizProductStructure::GetSemanticPMI(WString const& key, SemanticPMI*& out) const {
-    for (auto const& [id, container] : m_vizPMIContainers) {
+    for (auto const& [id, container] : m_containers->PMI()) {
         if (container && container->HasSemanticPMI() && container->GetSemanticPMI(key, out))
             return true;
     }
@@ -93,7 +164,7 @@ bool VizProductStructure::GetSemanticPMI(WString const& key, SemanticPMI*& out) 
 
 WString VizProductStructure::GetSemanticPMIAsString(WString const& key) const {
     WString text;
-    for (auto const& [id, container] : m_vizPMIContainers) {
+    for (auto const& [id, container] : m_containers->PMI()) {
         if (container && container->GetSemanticPMIAsString(key, text))
             break;
     }
@@ -101,13 +172,13 @@ WString VizProductStructure::GetSemanticPMIAsString(WString const& key) const {
 }
 
 void VizProductStructure::RemoveVizPartContainer(VizPartContainer* container) {
-    if (eraseFirst(m_vizPartContainers, container))
-        m_owned->Release(container);
+    // The caller owns it again.
+    static_cast<void>(m_containers->RemovePart(container).release());
 }
 
 void VizProductStructure::RemoveVizPMIContainer(VizPMIContainer* container) {
-    if (eraseFirst(m_vizPMIContainers, container))
-        m_owned->Release(container);
+    // The caller owns it again.
+    static_cast<void>(m_containers->RemovePMI(container).release());
 }
 
 WString VizProductStructure::ToString() const {
@@ -124,33 +195,25 @@ void VizProductStructure::AddRootEntry(VizPSEntry* entry) {
     m_rootEntries.push_back(entry);
 }
 
-void VizProductStructure::AddSubAssembly(int const& id, VizPSEntry* entry) {
+void VizProductStructure::AddSubAssembly(int const& id, std::unique_ptr<VizPSEntry> entry) {
     if (!entry)
         return;
     entry->SetProductStructure(this);
-    m_owned->Own(entry);
-    m_subAssemblies.emplace(id, entry);
+    m_subAssemblies.emplace(id, std::move(entry));
 }
 
-void VizProductStructure::AddVizPartContainer(int const& id, VizPartContainer* container) {
-    if (!container)
-        return;
-    m_owned->Own(container);
-    m_vizPartContainers[id] = container;
+void VizProductStructure::AddVizPartContainer(int const& id,
+                                              std::unique_ptr<VizPartContainer> container) {
+    m_containers->AddPart(id, std::move(container));
 }
 
-void VizProductStructure::AddVizContainer(int const& id, VizContainer* container) {
-    if (!container)
-        return;
-    m_owned->Own(container);
-    m_vizContainers[id] = container;
+void VizProductStructure::AddVizContainer(int const& id, std::unique_ptr<VizContainer> container) {
+    m_containers->AddGeometry(id, std::move(container));
 }
 
-void VizProductStructure::AddVizPMIContainer(int const& id, VizPMIContainer* container) {
-    if (!container)
-        return;
-    m_owned->Own(container);
-    m_vizPMIContainers[id] = container;
+void VizProductStructure::AddVizPMIContainer(int const& id,
+                                             std::unique_ptr<VizPMIContainer> container) {
+    m_containers->AddPMI(id, std::move(container));
 }
 
 void VizProductStructure::AddSemanticPMI(int const& id, SemanticPMIByKey* records) {

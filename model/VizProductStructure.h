@@ -1,8 +1,8 @@
 #pragma once
 
-#include "model/SemanticPMIMaps.h"
-#include "model/VizDocumentInfo.h"
-#include "model/VizTypes.h"
+#include <VizBridge/model/SemanticPMIMaps.h>
+#include <VizBridge/model/VizDocumentInfo.h>
+#include <VizBridge/model/VizTypes.h>
 
 #include <map>
 #include <memory>
@@ -11,7 +11,7 @@
 namespace VizBridgeTarvex {
 
 class VizBuilder;
-class VizOwnedObjects;
+class VizContainerStore;
 class VizPartContainer;
 class VizPSEntry;
 
@@ -19,14 +19,18 @@ class VizPSEntry;
 /// instances, per reference the containers of what was loaded, and every failure.
 ///
 /// Created by VizBuilder::MakeVizProductStructure, which hands it to the host; the host
-/// deletes it after every renderer on it. It owns all its entries and containers.
+/// deletes it after every builder and renderer on it. It owns all its entries and, with its
+/// copies, all its containers.
 ///
-/// Copies: a copy holds the same entries and containers. Copies share their ownership,
-/// so every copy may be destroyed in any order and the objects go with the last of them.
+/// Copies: a copy has an instance tree of its own (the same names, flags, placements and
+/// render ids, its entries pointing at the copy) and shares the containers with the
+/// structure it was copied from, which either may outlive.
 class VizProductStructure : private VizDocumentInfo {
 public:
-    VizProductStructure(VizProductStructure const&);
-    VizProductStructure& operator=(VizProductStructure const&);
+    VizProductStructure(VizProductStructure const& other);
+    VizProductStructure& operator=(VizProductStructure const& other);
+    /// Frees the tessellated containers, the PMI containers and the part containers, unless
+    /// a copy still holds them, and then the entries.
     ~VizProductStructure();
 
     // Document strings.
@@ -49,28 +53,23 @@ public:
     /// The first entry built for reference `id`, or null.
     VizPSEntry* GetSubAssembly(int const& id) const;
 
-    // Containers. A lookup never adds a key; an absent key gives null.
-    std::map<int, VizPartContainer*> const& GetAllVizPartContainers() const {
-        return m_vizPartContainers;
-    }
-    std::map<int, VizContainer*> const& GetAllVizContainers() const { return m_vizContainers; }
-    std::map<int, VizPMIContainer*> const& GetAllVizPMIContainers() const {
-        return m_vizPMIContainers;
-    }
+    // Containers, by reference id (0: the product level). A lookup never adds a key; an
+    // absent key gives null.
+    std::map<int, VizPartContainer*> const& GetAllVizPartContainers() const;
+    std::map<int, VizContainer*> const& GetAllVizContainers() const;
+    std::map<int, VizPMIContainer*> const& GetAllVizPMIContainers() const;
     VizPartContainer* GetVizPartContainer(int const& id) const;
     VizContainer* GetVizContainer(int const& id) const;
     VizPMIContainer* GetVizPMIContainer(int const& id) const;
-    int GetNumberOfVizPartContainers() const {
-        return static_cast<int>(m_vizPartContainers.size());
-    }
-    int GetNumberOfVizContainers() const { return static_cast<int>(m_vizContainers.size()); }
-    int GetNumberOfVizPMIContainers() const { return static_cast<int>(m_vizPMIContainers.size()); }
+    int GetNumberOfVizPartContainers() const;
+    int GetNumberOfVizContainers() const;
+    int GetNumberOfVizPMIContainers() const;
     int GetContainerCount() const { return m_containerCount; }
 
     // State.
     bool IsLoaded(int const& id) const { return m_subAssemblies.count(id) != 0; }
     bool IsVizLoaded(int const& id) const;
-    bool IsBREPLoaded(int const& id) const { return m_vizPartContainers.count(id) != 0; }
+    bool IsBREPLoaded(int const& id) const;
     bool IsSemanticInfoLoaded(int const& id) const;
     /// Nothing in the system sets these two: they stay false.
     bool IsAllBREPLoaded() const { return m_allBREPLoaded; }
@@ -95,9 +94,9 @@ public:
     /// Empty when no container knows `key`.
     WString GetSemanticPMIAsString(WString const& key) const;
 
-    /// Takes the first entry holding `container` out of the map and gives ownership back
-    /// to the caller. Other keys or copies that still name it then name the caller's object.
-    /// A pointer that is not in the map changes nothing.
+    /// Takes the first pair in key order that holds `container` out of the map, for this
+    /// structure and its copies, and gives ownership back to the caller. A pointer that is
+    /// not in the map changes nothing.
     void RemoveVizPartContainer(VizPartContainer* container);
     void RemoveVizPMIContainer(VizPMIContainer* container);
 
@@ -114,14 +113,13 @@ private:
     void AddRootEntry(VizPSEntry* entry);
     /// A null entry is ignored. Sets the entry's structure and takes ownership; never
     /// replaces an entry under the same id. Each entry may be added once.
-    void AddSubAssembly(int const& id, VizPSEntry* entry);
-    /// Take ownership and set the value under `id`. A null container is ignored (the
-    /// reference then counts as not loaded). A different container that stood under `id`
-    /// stays owned by the structure until it is destroyed, so pointers to it and its
-    /// elements that were handed out stay valid.
-    void AddVizPartContainer(int const& id, VizPartContainer* container);
-    void AddVizContainer(int const& id, VizContainer* container);
-    void AddVizPMIContainer(int const& id, VizPMIContainer* container);
+    void AddSubAssembly(int const& id, std::unique_ptr<VizPSEntry> entry);
+    /// Take ownership and set the value under `id`; a null container stands there as null.
+    /// A different container that stood under `id` stays owned by the structure until it is
+    /// destroyed, so pointers to it and its elements that were handed out stay valid.
+    void AddVizPartContainer(int const& id, std::unique_ptr<VizPartContainer> container);
+    void AddVizContainer(int const& id, std::unique_ptr<VizContainer> container);
+    void AddVizPMIContainer(int const& id, std::unique_ptr<VizPMIContainer> container);
     /// Hands every non-null record of `records`, in key order, to the PMI container of
     /// `id`. Records that no container takes are freed. On return `records` is empty; the
     /// map itself stays the caller's. A null map does nothing.
@@ -142,6 +140,8 @@ private:
     void setConfigurationName(WString const& name) { m_configurationName = name; }
     void setUnits(WString const& units) { m_units = units; }
     std::vector<WString> const& missingFiles() const { return m_missingFiles; }
+    /// Gives this structure copies of the entries of `other`, re-pointed at this one.
+    void copyEntries(VizProductStructure const& other);
 
     WString m_configurationName;
     WString m_units;
@@ -149,17 +149,16 @@ private:
     bool m_allBREPLoaded = false;
     bool m_allVizLoaded = false;
     bool m_tesselatingText = false;
-    std::vector<VizPSEntry*> m_rootEntries;               ///< not owned: m_subAssemblies' entries
-    std::multimap<int, VizPSEntry*> m_subAssemblies;      ///< owned, through m_owned
-    std::map<int, VizPartContainer*> m_vizPartContainers; ///< owned, through m_owned
-    std::map<int, VizContainer*> m_vizContainers;         ///< owned, through m_owned
-    std::map<int, VizPMIContainer*> m_vizPMIContainers;   ///< owned, through m_owned
+    std::vector<VizPSEntry*> m_rootEntries; ///< not owned: m_subAssemblies' entries
+    /// Every entry, under its reference id; equal keys in the order they were added.
+    std::multimap<int, std::unique_ptr<VizPSEntry>> m_subAssemblies;
     std::vector<WString> m_missingFiles;
     std::map<int, WString> m_missingReferences;
     std::map<int, WString> m_importErrors;
     std::map<int, WString> m_visuErrors;
-    /// Everything the structure owns, shared by its copies and freed with the last one.
-    std::shared_ptr<VizOwnedObjects> m_owned;
+    /// The containers and their maps, shared with the copies. Declared last, so that the
+    /// containers go before the entries.
+    std::shared_ptr<VizContainerStore> m_containers;
 };
 
 } // namespace VizBridgeTarvex

@@ -2,18 +2,18 @@
 
 // The contract types that the system's interface speaks in, named in its own namespace.
 
-#include "contracts/kolba/AVizContainer.h"
-#include "contracts/kolba/EntityId.h"
-#include "contracts/kolba/EntityType.h"
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/RenderId.h"
-#include "contracts/kolba/SemanticPMI.h"
-#include "contracts/kolba/VizBox.h"
-#include "contracts/kolba/VizContainer.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/kolba/VizPMIContainer.h"
-#include "contracts/kolba/VizTransf.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/AVizContainer.h>
+#include <VizBridge/contracts/kolba/EntityId.h>
+#include <VizBridge/contracts/kolba/EntityType.h>
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/RenderId.h>
+#include <VizBridge/contracts/kolba/SemanticPMI.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
+#include <VizBridge/contracts/kolba/VizContainer.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
+#include <VizBridge/contracts/kolba/VizTransf.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 namespace VizBridgeTarvex {
 

@@ -1,22 +1,23 @@
-#include "render/AVizRenderer.h"
+#include <VizBridge/render/AVizRenderer.h>
 
-#include "contracts/kolba/AGeometryItemFactory.h"
-#include "contracts/kolba/EntityContext.h"
-#include "contracts/kolba/EntityTypeContext.h"
-#include "contracts/kolba/GeometryItem.h"
-#include "contracts/kolba/Node.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/SceneLevelContext.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizPoints.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/platform/FormatW.h"
-#include "services/VizModelerServices.h"
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/EntityContext.h>
+#include <VizBridge/contracts/kolba/EntityTypeContext.h>
+#include <VizBridge/contracts/kolba/GeometryItem.h>
+#include <VizBridge/contracts/kolba/Node.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/kolba/TriangleType.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/platform/FormatW.h>
+#include <VizBridge/services/UniqueServices.h>
 
 #include <cstdint>
 #include <new>
@@ -33,14 +34,10 @@ namespace {
 
 constexpr std::size_t kTagNameBufferSize = 32;
 
-VizModelerServices* cloneOf(VizModelerServices* services) {
-    return services ? services->Clone() : nullptr;
-}
-
 } // namespace
 
 AVizRenderer::AVizRenderer(KolbaVizCore::SceneBuilder* builder, VizModelerServices* services)
-    : ARenderer(builder, nullptr), m_rendererServices(cloneOf(services)) {}
+    : ARenderer(builder, nullptr), m_rendererServices(CloneUnique(services)) {}
 
 AVizRenderer::AVizRenderer(AVizRenderer const& other)
     : ARenderer(other),
@@ -48,7 +45,7 @@ AVizRenderer::AVizRenderer(AVizRenderer const& other)
                                                            other.m_geometryCenter[1],
                                                            other.m_geometryCenter[2]},
       m_geometryRadius(other.m_geometryRadius),
-      m_rendererServices(cloneOf(other.m_rendererServices.get())), m_nextTag(other.m_nextTag) {}
+      m_rendererServices(CloneUnique(other.m_rendererServices.get())), m_nextTag(other.m_nextTag) {}
 
 AVizRenderer& AVizRenderer::operator=(AVizRenderer const& other) {
     if (this == &other)
@@ -58,7 +55,7 @@ AVizRenderer& AVizRenderer::operator=(AVizRenderer const& other) {
     for (int i = 0; i < 3; ++i)
         m_geometryCenter[i] = other.m_geometryCenter[i];
     m_geometryRadius = other.m_geometryRadius;
-    m_rendererServices.reset(cloneOf(other.m_rendererServices.get()));
+    m_rendererServices = CloneUnique(other.m_rendererServices.get());
     m_nextTag = other.m_nextTag;
     return *this;
 }
@@ -204,7 +201,7 @@ void AVizRenderer::renderVizPolygon(KolbaVizCore::VizPolygon const& polygon,
     std::vector<int> const& indices = polygon.GetIndices();
     std::size_t const n = indices.size();
     auto* const factory = getGeometryItemFactory();
-    if (type == 0 || !factory || n < 3)
+    if (type == KolbaVizCore::UndefinedTriangles || !factory || n < 3)
         return;
 
     // The item gets a flat copy of the points the indices name, so its own indices are
@@ -232,7 +229,9 @@ void AVizRenderer::renderVizPolygon(KolbaVizCore::VizPolygon const& polygon,
             flatNormals[3 * i + c] = read(normals, k + c);
         }
     }
-    int const mode = type == 2 ? 2 : type == 3 ? 3 : 1;
+    int const mode = type == KolbaVizCore::TriangleStrip || type == KolbaVizCore::TriangleFan
+                         ? type
+                         : KolbaVizCore::Triangles;
     unsigned long const tag = getNextTag();
     unsigned int const floatCount = static_cast<unsigned int>(3 * n);
     GeometryItem* const item =

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/ARenderer.h"
-#include "model/VizTypes.h"
+#include <VizBridge/contracts/kolba/ARenderer.h>
+#include <VizBridge/model/VizTypes.h>
 
 #include <memory>
 #include <vector>

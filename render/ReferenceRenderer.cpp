@@ -1,4 +1,4 @@
-#include "render/ReferenceRenderer.h"
+#include <VizBridge/render/ReferenceRenderer.h>
 
 namespace VizBridgeTarvex {
 

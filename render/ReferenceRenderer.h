@@ -6,8 +6,9 @@ class ARenderer;
 
 namespace VizBridgeTarvex {
 
-/// A renderer with a placement: a plain record for hosts that place one renderer's drawing
-/// several times. Points at the renderer without owning it; copies copy everything.
+/// A renderer with a placement: a plain record offered to hosts that place one renderer's
+/// drawing several times; nothing in VizBridge uses it. Points at the renderer without owning
+/// it; copies copy everything.
 /// Matrix elements below 1e-10 (negative ones included) are stored as 0.
 struct ReferenceRenderer {
     /// `matrix` is 16 doubles, row by row.

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/VizTypes.h"
+#include <VizBridge/model/VizTypes.h>
 
 namespace VizBridgeTarvex {
 

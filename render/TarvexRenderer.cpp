@@ -1,12 +1,12 @@
-#include "render/TarvexRenderer.h"
+#include <VizBridge/render/TarvexRenderer.h>
 
-#include "contracts/kolba/AView3DAdapter.h"
-#include "contracts/kolba/AllowThrow.h"
-#include "contracts/kolba/Dbg.h"
-#include "contracts/kolba/IView3D.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "model/VizProductStructure.h"
-#include "services/VizModelerServices.h"
+#include <VizBridge/contracts/kolba/AView3DAdapter.h>
+#include <VizBridge/contracts/kolba/AllowThrow.h>
+#include <VizBridge/contracts/kolba/Dbg.h>
+#include <VizBridge/contracts/kolba/IView3D.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/services/VizModelerServices.h>
 
 #include <cmath>
 #include <exception>
@@ -80,6 +80,10 @@ bool TarvexRenderer::Render() {
             total = m_productStructure->GetNumberOfVizPartContainers() +
                     m_productStructure->GetNumberOfVizContainers();
             m_level = 0;
+            if (!getSceneBuilder()) // the walk skips what it cannot open: say why nothing shows
+                KolbaVizCore::dbg << "TarvexRenderer::Render : the renderer has no scene "
+                                     "builder, so nothing is drawn"
+                                  << std::endl;
             reportProgress(0, total, "RenderInit");
             result = renderRootInstances();
             if (result && !m_geometryBox.IsEmpty()) {
@@ -150,24 +154,24 @@ bool TarvexRenderer::preRender() {
     return true;
 }
 
-void TarvexRenderer::postRender() {}
+void TarvexRenderer::postRender() {
+    // Nothing to finish: Render leaves the scene complete, and whoever drives the renderer
+    // through ARenderer calls this only for symmetry with preRender.
+}
 
 void TarvexRenderer::cleanPSData() {
     if (m_productRenderId.Length() <= 1)
         return;
-    for (auto* renderers : {&m_brepRenderers, &m_pmiRenderers}) {
-        for (auto& entry : *renderers) {
-            if (entry.second) {
-                entry.second->ClearAll();
-                entry.second.reset();
-            }
+    for (auto& [id, renderer] : m_brepRenderers) {
+        if (renderer) {
+            renderer->ClearAll();
+            renderer.reset();
         }
-        renderers->clear();
     }
+    m_brepRenderers.clear();
     if (auto* const builder = getSceneBuilder())
         builder->RemoveNode(m_productRenderId);
     m_productRenderId.Clear();
-    m_pmiRenderMap.clear();
     m_geometryRenderMap.clear();
     m_brepRenderMap.clear();
     m_productTag = 0;

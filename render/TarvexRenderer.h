@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/platform/RecursiveLock.h"
-#include "render/AVizRenderer.h"
-#include "render/RenderedGeometry.h"
+#include <VizBridge/contracts/platform/RecursiveLock.h>
+#include <VizBridge/render/AVizRenderer.h>
+#include <VizBridge/render/RenderedGeometry.h>
 
 #include <cstdint>
 #include <map>
@@ -42,12 +42,13 @@ public:
     ~TarvexRenderer() override;
 
     /// Draws the whole product. Never throws unless the scene library's throw switch is on;
-    /// a failure is reported on KolbaVizCore::dbg.
+    /// a failure is reported on KolbaVizCore::dbg. Without a SceneBuilder nothing is drawn,
+    /// the answer is still true, and KolbaVizCore::dbg says so.
     bool Render() override;
     /// Removes the drawing and the sub-renderers, and forgets the box.
     void ClearAll() override;
 
-    /// Picking and highlighting come with the id conversions; until then nothing converts.
+    /// Not built yet: the id conversions are still to come, so these answer false.
     bool Convert(RenderId const& id, EntityId& entity) override;
     bool Convert(EntityId const& entity, RenderId& id) override;
     bool ConvertToHighlight(RenderId const& id, RenderId*& ids, int& count) override;
@@ -77,8 +78,9 @@ protected:
     // One reference's content, drawn once and referenced by further instances.
     bool renderPartBREP(int const& id, VizTransf const& transformation, VizBox& box);
     bool renderPartGeometry(int const& id, VizTransf const& transformation, VizBox& box);
+    /// Not built yet: draws nothing until the PMI renderer exists.
     bool renderPartPMI(int const& id, VizTransf const& transformation, VizBox& box);
-    RenderId renderGeom(VizContainer const* container, VizBox& box);
+    RenderId renderGeom(VizContainer const& container, VizBox& box);
 
     // Read by the id conversions.
     VizProductStructure* productStructure() const { return m_productStructure; }
@@ -107,9 +109,7 @@ private:
     std::map<int, RenderedGeometry> m_brepRenderMap;
     /// Per reference id, the renderer the modeler services made; a value may be null.
     std::map<int, std::unique_ptr<KolbaVizCore::ARenderer>> m_brepRenderers;
-    std::map<int, std::unique_ptr<KolbaVizCore::ARenderer>> m_pmiRenderers;
     std::map<int, RenderedGeometry> m_geometryRenderMap;
-    std::map<int, RenderedGeometry> m_pmiRenderMap;
     std::map<EntityId, RenderId> m_linkMap;
     int m_level = 0;
     bool m_colorOverride = false;

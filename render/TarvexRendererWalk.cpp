@@ -1,22 +1,24 @@
 // The walk of TarvexRenderer over the instances, and the drawing of one reference.
-#include "render/TarvexRenderer.h"
+#include <VizBridge/render/TarvexRenderer.h>
 
-#include "contracts/kolba/BodyContext.h"
-#include "contracts/kolba/ConstructionContext.h"
-#include "contracts/kolba/ContainerContext.h"
-#include "contracts/kolba/EntityTypeContext.h"
-#include "contracts/kolba/Node.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/SceneContext.h"
-#include "contracts/kolba/SceneLevelContext.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/platform/FormatW.h"
-#include "model/VizPSEntry.h"
-#include "model/VizProductStructure.h"
-#include "render/SameRenderId.h"
-#include "services/VizModelerServices.h"
+#include <VizBridge/contracts/kolba/BodyContext.h>
+#include <VizBridge/contracts/kolba/ConstructionContext.h>
+#include <VizBridge/contracts/kolba/ContainerContext.h>
+#include <VizBridge/contracts/kolba/EntityTypeContext.h>
+#include <VizBridge/contracts/kolba/Node.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneContext.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/platform/FormatW.h>
+#include <VizBridge/model/BoxTransform.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/render/SameRenderId.h>
+#include <VizBridge/services/UniqueServices.h>
+#include <VizBridge/services/VizModelerServices.h>
 
 #include <cmath>
 #include <cstdint>
@@ -30,26 +32,10 @@ using KolbaVizCore::SceneBuilder;
 namespace {
 
 constexpr std::uint32_t kProductContainerType = 1;
-constexpr std::uint32_t kPartTag = 10007;
+/// The type of the part records in the link map; no entity type has this value.
 constexpr std::uint32_t kPartRecordType = 40000;
 constexpr unsigned long kTagsPerLevel = 1000;
 constexpr std::size_t kBodyNameBufferSize = 64;
-
-/// The box around the eight corners of `box` moved by `transformation`: how boxes move when
-/// no modeler services are there to explode them.
-VizBox moveBox(VizTransf const& transformation, VizBox const& box) {
-    VizBox moved;
-    double const* const low = box.GetLow();
-    double const* const high = box.GetHigh();
-    for (int corner = 0; corner < 8; ++corner) {
-        double const point[3] = {(corner & 1) ? high[0] : low[0], (corner & 2) ? high[1] : low[1],
-                                 (corner & 4) ? high[2] : low[2]};
-        double mapped[3];
-        transformation.Apply(point, mapped);
-        moved.Add(mapped);
-    }
-    return moved;
-}
 
 template <typename Element>
 void appendPresent(std::vector<Element*>& to, std::vector<Element*> const& from) {
@@ -240,7 +226,7 @@ void TarvexRenderer::finishBox(VizTransf const& transformation, VizBox const& lo
         return;
     VizModelerServices* const services = rendererServices();
     box = services ? services->ExplodeBox(transformation, local, m_explodeX, m_explodeY, m_explodeZ)
-                   : moveBox(transformation, local);
+                   : TransformBox(transformation, local);
 }
 
 bool TarvexRenderer::renderPartBREP(int const& id, VizTransf const& transformation, VizBox& box) {
@@ -265,9 +251,9 @@ bool TarvexRenderer::renderPartBREP(int const& id, VizTransf const& transformati
     } else if (VizModelerServices* const services = rendererServices()) {
         RenderId current;
         builder->GetCurrentRenderId(current);
-        // The modeler hands the new renderer over; it is kept only if it rendered.
-        std::unique_ptr<KolbaVizCore::ARenderer> renderer(
-            services->CreateRenderer(container, builder, &current));
+        // Kept only if it rendered.
+        std::unique_ptr<KolbaVizCore::ARenderer> renderer =
+            CreateUniqueRenderer(*services, container, builder, &current);
         if (renderer) {
             renderer->SetBuilderOwnership(false);
             if (renderer->Render()) {
@@ -299,7 +285,7 @@ bool TarvexRenderer::renderPartGeometry(int const& id, VizTransf const& transfor
         bool referenced = false;
         referenceRecorded(recorded->second.path, referenced);
     } else if (VizContainer const* const container = m_productStructure->GetVizContainer(id)) {
-        RenderId const path = renderGeom(container, local);
+        RenderId const path = renderGeom(*container, local);
         // A container with nothing to draw is tried again by the next instance.
         if (!path.IsEmpty() && !local.IsEmpty())
             m_geometryRenderMap[id] = RenderedGeometry{path, local};
@@ -309,22 +295,20 @@ bool TarvexRenderer::renderPartGeometry(int const& id, VizTransf const& transfor
 }
 
 bool TarvexRenderer::renderPartPMI(int const&, VizTransf const&, VizBox&) {
-    // PMI is drawn by the PMI renderer, which comes with the PMI scene; until then a
-    // reference's PMI container shows nothing and adds nothing to the box.
+    // Not built yet: the PMI renderer is still to come, so a reference's PMI container shows
+    // nothing and adds nothing to the box.
     return true;
 }
 
-RenderId TarvexRenderer::renderGeom(VizContainer const* container, VizBox& box) {
-    if (!container)
-        return RenderId();
+RenderId TarvexRenderer::renderGeom(VizContainer const& container, VizBox& box) {
     SceneBuilder* const builder = getSceneBuilder();
-    KolbaVizCore::SceneLevelContext const part(builder, kPartTag, u"Part");
+    KolbaVizCore::SceneLevelContext const part(builder, KolbaVizCore::Group, u"Part");
     if (!part.IsOK())
         return RenderId();
     RenderId path;
     builder->GetCurrentRenderId(path);
 
-    float const scale = static_cast<float>(container->GetScaleFactor());
+    float const scale = static_cast<float>(container.GetScaleFactor());
     bool scaled = false;
     VizTransf scaling;
     if (scale != 1.0f && std::fabs(scale) > 1e-5f) {
@@ -333,14 +317,14 @@ RenderId TarvexRenderer::renderGeom(VizContainer const* container, VizBox& box) 
     }
 
     std::vector<KolbaVizCore::VizMesh*> meshes;
-    appendPresent(meshes, container->GetMeshes());
-    appendPresent(meshes, container->GetCGMeshes());
+    appendPresent(meshes, container.GetMeshes());
+    appendPresent(meshes, container.GetCGMeshes());
     std::vector<KolbaVizCore::VizWire*> wires;
-    appendPresent(wires, container->GetWires());
-    appendPresent(wires, container->GetCGWires());
+    appendPresent(wires, container.GetWires());
+    appendPresent(wires, container.GetCGWires());
     std::vector<KolbaVizCore::VizPointSet*> pointSets;
-    appendPresent(pointSets, container->GetPointSets());
-    appendPresent(pointSets, container->GetCGPointSets());
+    appendPresent(pointSets, container.GetPointSets());
+    appendPresent(pointSets, container.GetCGPointSets());
 
     // Opens the body node of one element, marks the element with its path and entity id,
     // and lets `draw` fill the node.

@@ -1,7 +1,7 @@
 // Replaces the global operator new and delete for the benchmark program that links this
 // file, so that it can read how many bytes are live. Each block carries its size in a header
 // that keeps the default new alignment.
-#include "bench/support/LiveBytes.h"
+#include "support/LiveBytes.h"
 
 #include <atomic>
 #include <cstddef>

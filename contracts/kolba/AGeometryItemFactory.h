@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/FontAttr.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/FontAttr.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 namespace KolbaVizCore {
 

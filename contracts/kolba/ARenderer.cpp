@@ -1,6 +1,6 @@
-#include "contracts/kolba/ARenderer.h"
+#include <VizBridge/contracts/kolba/ARenderer.h>
 
-#include "contracts/kolba/SceneBuilder.h"
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
 
 #include <memory>
 

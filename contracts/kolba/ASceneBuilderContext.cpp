@@ -1,6 +1,6 @@
-#include "contracts/kolba/ASceneBuilderContext.h"
+#include <VizBridge/contracts/kolba/ASceneBuilderContext.h>
 
-#include "contracts/kolba/SceneBuilder.h"
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
 
 namespace KolbaVizCore {
 

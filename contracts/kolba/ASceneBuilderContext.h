@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/ContextKind.h"
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/ContextKind.h>
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <cstdint>
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/AVizContainer.h"
+#include <VizBridge/contracts/kolba/AVizContainer.h>
 
 namespace KolbaVizCore {
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/AVizElementLoader.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
 
 #include <cstddef>
 

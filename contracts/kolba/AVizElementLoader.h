@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/VizElement.h"
+#include <VizBridge/contracts/kolba/VizElement.h>
 
 #include <memory>
 #include <vector>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/VizMesh.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
 
 #include <memory>
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/AVizPMILoader.h"
+#include <VizBridge/contracts/kolba/AVizPMILoader.h>
 
 #include <memory>
 

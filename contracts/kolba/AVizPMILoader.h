@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/EntityType.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPMIType.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/EntityType.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPMIType.h>
 
 namespace KolbaVizCore {
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/VizPointSet.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
 
 #include <memory>
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/VizPolygon.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
 
 #include <memory>
 

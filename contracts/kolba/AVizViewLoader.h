@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/VizView.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/VizView.h>
 
 #include <memory>
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/AllowThrow.h"
+#include <VizBridge/contracts/kolba/AllowThrow.h>
 
 #include <atomic>
 

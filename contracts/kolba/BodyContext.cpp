@@ -1,4 +1,4 @@
-#include "contracts/kolba/BodyContext.h"
+#include <VizBridge/contracts/kolba/BodyContext.h>
 
 namespace KolbaVizCore {
 

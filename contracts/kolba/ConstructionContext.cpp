@@ -1,4 +1,4 @@
-#include "contracts/kolba/ConstructionContext.h"
+#include <VizBridge/contracts/kolba/ConstructionContext.h>
 
 namespace KolbaVizCore {
 

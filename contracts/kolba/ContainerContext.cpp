@@ -1,4 +1,4 @@
-#include "contracts/kolba/ContainerContext.h"
+#include <VizBridge/contracts/kolba/ContainerContext.h>
 
 namespace KolbaVizCore {
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/Dbg.h"
+#include <VizBridge/contracts/kolba/Dbg.h>
 
 #include <streambuf>
 

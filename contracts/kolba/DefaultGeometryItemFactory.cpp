@@ -1,11 +1,11 @@
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
 
-#include "contracts/kolba/LineSetItem.h"
-#include "contracts/kolba/PointItem.h"
-#include "contracts/kolba/PolygonItem.h"
-#include "contracts/kolba/PolylineItem.h"
-#include "contracts/kolba/TextItem.h"
-#include "contracts/kolba/TriangleType.h"
+#include <VizBridge/contracts/kolba/LineSetItem.h>
+#include <VizBridge/contracts/kolba/PointItem.h>
+#include <VizBridge/contracts/kolba/PolygonItem.h>
+#include <VizBridge/contracts/kolba/PolylineItem.h>
+#include <VizBridge/contracts/kolba/TextItem.h>
+#include <VizBridge/contracts/kolba/TriangleType.h>
 
 #include <algorithm>
 #include <memory>

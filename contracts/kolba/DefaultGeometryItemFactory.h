@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/AGeometryItemFactory.h"
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
 
 namespace KolbaVizCore {
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/EntityContext.h"
+#include <VizBridge/contracts/kolba/EntityContext.h>
 
 namespace KolbaVizCore {
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/EntityType.h"
+#include <VizBridge/contracts/kolba/EntityType.h>
 
 #include <cstdint>
 #include <tuple>

@@ -1,4 +1,4 @@
-#include "contracts/kolba/EntityTypeContext.h"
+#include <VizBridge/contracts/kolba/EntityTypeContext.h>
 
 namespace KolbaVizCore {
 

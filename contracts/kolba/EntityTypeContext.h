@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/ASceneBuilderContext.h"
-#include "contracts/kolba/EntityType.h"
+#include <VizBridge/contracts/kolba/ASceneBuilderContext.h>
+#include <VizBridge/contracts/kolba/EntityType.h>
 
 namespace KolbaVizCore {
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/LineSetItem.h"
+#include <VizBridge/contracts/kolba/LineSetItem.h>
 
 #include <utility>
 

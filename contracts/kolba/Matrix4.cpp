@@ -1,4 +1,4 @@
-#include "contracts/kolba/Matrix4.h"
+#include <VizBridge/contracts/kolba/Matrix4.h>
 
 #include <algorithm>
 

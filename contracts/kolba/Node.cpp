@@ -1,4 +1,4 @@
-#include "contracts/kolba/Node.h"
+#include <VizBridge/contracts/kolba/Node.h>
 
 #include <algorithm>
 #include <atomic>

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "contracts/kolba/ContextKind.h"
-#include "contracts/kolba/GeometryItem.h"
-#include "contracts/kolba/Matrix4.h"
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/RenderId.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/ContextKind.h>
+#include <VizBridge/contracts/kolba/GeometryItem.h>
+#include <VizBridge/contracts/kolba/Matrix4.h>
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/RenderId.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <cstdint>
 #include <memory>

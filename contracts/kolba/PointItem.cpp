@@ -1,7 +1,7 @@
-#include "contracts/kolba/PointItem.h"
+#include <VizBridge/contracts/kolba/PointItem.h>
 
-#include "contracts/kolba/Matrix4.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/Matrix4.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <sstream>
 

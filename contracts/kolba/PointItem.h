@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/GeometryItem.h"
+#include <VizBridge/contracts/kolba/GeometryItem.h>
 
 #include <array>
 

@@ -1,9 +1,9 @@
-#include "contracts/kolba/PolygonItem.h"
+#include <VizBridge/contracts/kolba/PolygonItem.h>
 
-#include "contracts/kolba/Matrix4.h"
-#include "contracts/kolba/Ray.h"
-#include "contracts/kolba/TriangleType.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/Matrix4.h>
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/TriangleType.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <cmath>
 #include <sstream>

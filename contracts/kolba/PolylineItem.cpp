@@ -1,4 +1,4 @@
-#include "contracts/kolba/PolylineItem.h"
+#include <VizBridge/contracts/kolba/PolylineItem.h>
 
 #include <utility>
 

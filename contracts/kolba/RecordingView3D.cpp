@@ -1,4 +1,4 @@
-#include "contracts/kolba/RecordingView3D.h"
+#include <VizBridge/contracts/kolba/RecordingView3D.h>
 
 namespace KolbaVizCore {
 

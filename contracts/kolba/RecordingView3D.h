@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/IView3D.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/IView3D.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <array>
 #include <vector>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/RGBAColor.h"
+#include <VizBridge/contracts/kolba/RGBAColor.h>
 
 namespace KolbaVizCore {
 

@@ -1,9 +1,9 @@
-#include "contracts/kolba/SceneBuilder.h"
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
 
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
-#include "contracts/kolba/GeometryItem.h"
-#include "contracts/kolba/Ray.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/GeometryItem.h>
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <algorithm>
 #include <cmath>

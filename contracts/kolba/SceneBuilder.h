@@ -1,13 +1,13 @@
 #pragma once
 
-#include "contracts/kolba/AGeometryItemFactory.h"
-#include "contracts/kolba/ContextKind.h"
-#include "contracts/kolba/Matrix4.h"
-#include "contracts/kolba/Node.h"
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/kolba/RenderId.h"
-#include "contracts/kolba/RenderingOptions.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/ContextKind.h>
+#include <VizBridge/contracts/kolba/Matrix4.h>
+#include <VizBridge/contracts/kolba/Node.h>
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/kolba/RenderId.h>
+#include <VizBridge/contracts/kolba/RenderingOptions.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <cstdint>
 #include <memory>

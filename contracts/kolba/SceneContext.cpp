@@ -1,4 +1,4 @@
-#include "contracts/kolba/SceneContext.h"
+#include <VizBridge/contracts/kolba/SceneContext.h>
 
 namespace KolbaVizCore {
 

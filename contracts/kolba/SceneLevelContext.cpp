@@ -1,4 +1,4 @@
-#include "contracts/kolba/SceneLevelContext.h"
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
 
 namespace KolbaVizCore {
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/ASceneBuilderContext.h"
+#include <VizBridge/contracts/kolba/ASceneBuilderContext.h>
 
 namespace KolbaVizCore {
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/SemanticPMI.h"
+#include <VizBridge/contracts/kolba/SemanticPMI.h>
 
 namespace KolbaVizCore {
 

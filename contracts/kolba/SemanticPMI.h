@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/EntityId.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/EntityId.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <map>
 #include <vector>

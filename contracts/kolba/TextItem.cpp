@@ -1,7 +1,7 @@
-#include "contracts/kolba/TextItem.h"
+#include <VizBridge/contracts/kolba/TextItem.h>
 
-#include "contracts/kolba/Matrix4.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/Matrix4.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <sstream>
 #include <utility>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/FontAttr.h"
-#include "contracts/kolba/GeometryItem.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/FontAttr.h>
+#include <VizBridge/contracts/kolba/GeometryItem.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <array>
 

@@ -1,6 +1,6 @@
-#include "contracts/kolba/View3DAdapter.h"
+#include <VizBridge/contracts/kolba/View3DAdapter.h>
 
-#include "contracts/kolba/SceneBuilder.h"
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
 
 namespace KolbaVizCore {
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/kolba/AView3DAdapter.h"
+#include <VizBridge/contracts/kolba/AView3DAdapter.h>
 
 namespace KolbaVizCore {
 

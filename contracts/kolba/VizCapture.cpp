@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizCapture.h"
+#include <VizBridge/contracts/kolba/VizCapture.h>
 
 #include <algorithm>
 #include <cstddef>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/VizPMICollection.h"
-#include "contracts/kolba/VizPlane.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/VizPMICollection.h>
+#include <VizBridge/contracts/kolba/VizPlane.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <array>
 #include <string>

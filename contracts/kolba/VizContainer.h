@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/kolba/AVizContainer.h"
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizWire.h"
+#include <VizBridge/contracts/kolba/AVizContainer.h>
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
 
 #include <vector>
 

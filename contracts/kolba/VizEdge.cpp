@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizEdge.h"
+#include <VizBridge/contracts/kolba/VizEdge.h>
 
 namespace KolbaVizCore {
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/VizElement.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <string>
 #include <vector>

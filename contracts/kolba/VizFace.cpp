@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizFace.h"
+#include <VizBridge/contracts/kolba/VizFace.h>
 
 namespace KolbaVizCore {
 

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <string>
 #include <vector>

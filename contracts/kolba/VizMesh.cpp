@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizMesh.h"
+#include <VizBridge/contracts/kolba/VizMesh.h>
 
 namespace KolbaVizCore {
 

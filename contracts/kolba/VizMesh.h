@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <map>
 #include <string>

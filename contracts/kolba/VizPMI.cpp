@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizPMI.h"
+#include <VizBridge/contracts/kolba/VizPMI.h>
 
 namespace KolbaVizCore {
 

@@ -1,12 +1,12 @@
 #pragma once
 
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizPMIType.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizPMIType.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <string>
 #include <vector>

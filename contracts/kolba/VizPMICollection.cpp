@@ -1,9 +1,9 @@
-#include "contracts/kolba/VizPMICollection.h"
+#include <VizBridge/contracts/kolba/VizPMICollection.h>
 
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPMI.h"
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
 
 #include <algorithm>
 #include <cstddef>

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/kolba/EntityId.h"
-#include "contracts/kolba/RenderId.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/kolba/EntityId.h>
+#include <VizBridge/contracts/kolba/RenderId.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <map>
 #include <utility>

@@ -1,15 +1,15 @@
 #pragma once
 
-#include "contracts/kolba/AVizContainer.h"
-#include "contracts/kolba/EntityId.h"
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/SemanticPMI.h"
-#include "contracts/kolba/VizCapture.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizView.h"
-#include "contracts/kolba/VizWire.h"
+#include <VizBridge/contracts/kolba/AVizContainer.h>
+#include <VizBridge/contracts/kolba/EntityId.h>
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/SemanticPMI.h>
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
 
 #include <map>
 #include <memory>

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizPMIType.h"
+#include <VizBridge/contracts/kolba/VizPMIType.h>
 
 namespace KolbaVizCore {
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizPlane.h"
+#include <VizBridge/contracts/kolba/VizPlane.h>
 
 #include <algorithm>
 #include <cstddef>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/VizElement.h"
-#include "contracts/kolba/VizPoints.h"
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
 
 #include <string>
 #include <vector>

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizPolygon.h"
+#include <VizBridge/contracts/kolba/VizPolygon.h>
 
 namespace KolbaVizCore {
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/kolba/TriangleType.h"
-#include "contracts/kolba/VizElement.h"
+#include <VizBridge/contracts/kolba/TriangleType.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
 
 #include <string>
 #include <vector>

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizText.h"
+#include <VizBridge/contracts/kolba/VizText.h>
 
 #include <algorithm>
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizView.h"
+#include <VizBridge/contracts/kolba/VizView.h>
 
 namespace KolbaVizCore {
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/OwnedPointers.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizElement.h"
+#include <VizBridge/contracts/kolba/OwnedPointers.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizElement.h>
 
 #include <string>
 #include <vector>

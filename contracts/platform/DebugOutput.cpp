@@ -1,4 +1,4 @@
-#include "contracts/platform/DebugOutput.h"
+#include <VizBridge/contracts/platform/DebugOutput.h>
 
 #include <memory>
 #include <mutex>

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuAttributes.h"
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexLengthUnitType.h"
-#include "contracts/tarvex/TarvexVisuNode.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
 
 #include <vector>
 

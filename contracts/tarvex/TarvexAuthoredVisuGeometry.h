@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexVisuGeometryType.h"
-#include "contracts/tarvex/TarvexVisuLineType.h"
-#include "contracts/tarvex/TarvexVisuPolygonType.h"
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuGeometryType.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuLineType.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygonType.h>
 
 #include <array>
 #include <optional>

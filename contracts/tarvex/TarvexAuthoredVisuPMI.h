@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexAuthoredEntity.h"
-#include "contracts/tarvex/TarvexAuthoredVisuAttributes.h"
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
 
 #include <array>
 #include <optional>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexAuthoredEntity.h"
-#include "contracts/tarvex/TarvexVisuCamera.h"
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCamera.h>
 
 #include <array>
 #include <optional>

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexDocument.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 TarvexDocumentInformation TarvexDocument::GetInformation() {
     if (!m_data) {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexDocumentInformation.h"
+#include <VizBridge/contracts/tarvex/TarvexDocumentInformation.h>
 
 #include <memory>
 

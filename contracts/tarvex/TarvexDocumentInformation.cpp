@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexDocumentInformation.h"
+#include <VizBridge/contracts/tarvex/TarvexDocumentInformation.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 #include <optional>
 

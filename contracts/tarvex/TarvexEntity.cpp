@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexEntity.h"
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
 
-#include "contracts/tarvex/TarvexInstanceEntity.h"
-#include "contracts/tarvex/TarvexModelData.h"
-#include "contracts/tarvex/TarvexVisuEntity.h"
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
 
 bool TarvexEntity::GetInstanceEntity(TarvexInstanceEntity& instanceEntity) const {
     if (!m_data) {

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredEntity.h"
-#include "contracts/tarvex/TarvexVisuEntity.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
 
 #include <memory>
 #include <vector>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredEntity.h"
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
 
 #include <memory>
 

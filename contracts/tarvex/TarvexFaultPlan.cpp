@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexFaultPlan.h"
+#include <VizBridge/contracts/tarvex/TarvexFaultPlan.h>
 
 #include <climits>
 #include <optional>

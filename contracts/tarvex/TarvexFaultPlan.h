@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexFault.h"
+#include <VizBridge/contracts/tarvex/TarvexFault.h>
 
 #include <mutex>
 #include <vector>

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexFontCache.h"
+#include <VizBridge/contracts/tarvex/TarvexFontCache.h>
 
 #include <algorithm>
 #include <string_view>

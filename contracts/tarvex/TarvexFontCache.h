@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexGlyphSource.h"
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexGlyphSource.h>
 
 #include <functional>
 #include <map>

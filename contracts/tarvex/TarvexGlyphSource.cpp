@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexGlyphSource.h"
+#include <VizBridge/contracts/tarvex/TarvexGlyphSource.h>
 
 #include <ft2build.h>
 #include FT_FREETYPE_H

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexPolygonTriangulator.h"
+#include <VizBridge/contracts/tarvex/TarvexPolygonTriangulator.h>
 
 #include <map>
 #include <memory>

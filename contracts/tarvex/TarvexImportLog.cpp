@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexImportLog.h"
+#include <VizBridge/contracts/tarvex/TarvexImportLog.h>
 
 void TarvexImportLog::Add(TarvexImportCall call) {
     std::lock_guard<std::mutex> const lock(m_mutex);

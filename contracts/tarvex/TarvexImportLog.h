@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexImportCall.h"
+#include <VizBridge/contracts/tarvex/TarvexImportCall.h>
 
 #include <mutex>
 #include <vector>

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexInputPSMissingFileIter.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSMissingFileIter.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 int TarvexInputPSMissingFileIter::GetCount() const {
     if (!m_data) {

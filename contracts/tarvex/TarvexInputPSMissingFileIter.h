@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexInputPSReference.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
 
-#include "contracts/tarvex/TarvexInputPSInstance.h"
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 namespace {
 

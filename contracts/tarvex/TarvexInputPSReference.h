@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexInputProductStructure.h"
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 TarvexWString TarvexInputProductStructure::GetProductName() const {
     if (!m_data) {

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexInputPSInstance.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexLengthUnitType.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexInstanceEntity.h"
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 namespace {
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexInputPSInstance.h"
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSInstance.h>
 
 /// An entity seen from an instance: the instance, and the entity relative to that instance's
 /// reference.

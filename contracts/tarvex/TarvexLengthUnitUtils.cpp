@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexLengthUnitUtils.h"
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitUtils.h>
 
 #include <array>
 #include <optional>

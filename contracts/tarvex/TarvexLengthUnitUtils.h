@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexLengthUnitType.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 /// Unit table:
 ///   value  name          text   metres

@@ -1,10 +1,10 @@
-#include "contracts/tarvex/TarvexModel.h"
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
 
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModelData.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "contracts/tarvex/TarvexPartConversion.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexPartConversion.h>
 
 #include <stdexcept>
 #include <string>

@@ -1,13 +1,13 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredDocument.h"
-#include "contracts/tarvex/TarvexAuthoredInstance.h"
-#include "contracts/tarvex/TarvexAuthoredReference.h"
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexFaultPlan.h"
-#include "contracts/tarvex/TarvexImportCall.h"
-#include "contracts/tarvex/TarvexLengthUnitType.h"
-#include "contracts/tarvex/TarvexPMIAnnotation.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredReference.h>
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexFaultPlan.h>
+#include <VizBridge/contracts/tarvex/TarvexImportCall.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
+#include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
 
 #include <memory>
 #include <optional>

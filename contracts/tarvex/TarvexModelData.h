@@ -1,14 +1,14 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
-#include "contracts/tarvex/TarvexAuthoredDocument.h"
-#include "contracts/tarvex/TarvexAuthoredInstance.h"
-#include "contracts/tarvex/TarvexAuthoredReference.h"
-#include "contracts/tarvex/TarvexFaultPlan.h"
-#include "contracts/tarvex/TarvexFontCache.h"
-#include "contracts/tarvex/TarvexImportLog.h"
-#include "contracts/tarvex/TarvexLengthUnitType.h"
-#include "contracts/tarvex/TarvexPartConversion.h"
+#include <VizBridge/contracts/platform/WString.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredReference.h>
+#include <VizBridge/contracts/tarvex/TarvexFaultPlan.h>
+#include <VizBridge/contracts/tarvex/TarvexFontCache.h>
+#include <VizBridge/contracts/tarvex/TarvexImportLog.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
+#include <VizBridge/contracts/tarvex/TarvexPartConversion.h>
 
 #include <deque>
 #include <map>

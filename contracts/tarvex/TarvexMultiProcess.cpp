@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexMultiProcess.h"
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
 
 #include <algorithm>
 #include <atomic>

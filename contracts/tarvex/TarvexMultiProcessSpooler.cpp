@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexMultiProcessSpooler.h"
+#include <VizBridge/contracts/tarvex/TarvexMultiProcessSpooler.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
-#include "contracts/tarvex/TarvexSpoolerState.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
+#include <VizBridge/contracts/tarvex/TarvexSpoolerState.h>
 
 namespace {
 

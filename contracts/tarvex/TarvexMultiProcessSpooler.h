@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexRep.h"
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexRep.h>
 
 #include <memory>
 

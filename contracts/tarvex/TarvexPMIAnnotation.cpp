@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexPMIAnnotation.h"
+#include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 // The linked elements are the annotation's own; the model is only asked for its fault plan.
 

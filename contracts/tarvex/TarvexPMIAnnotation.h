@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexEntity.h"
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
 
 #include <memory>
 #include <vector>

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexPSImportResult.h"
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 TarvexInputPSMissingFileIter TarvexPSImportResult::GetMissingFileIterator() const {
     if (!m_data) {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexInputPSMissingFileIter.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSMissingFileIter.h>
 
 #include <memory>
 

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexPartConversion.h"
+#include <VizBridge/contracts/tarvex/TarvexPartConversion.h>
 
 #include <algorithm>
 #include <chrono>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredPartGeometry.h"
-#include "contracts/tarvex/TarvexConvertedPart.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredPartGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexConvertedPart.h>
 
 #include <condition_variable>
 #include <cstddef>

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexPartDocument.h"
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 TarvexWString TarvexPartDocument::GetName() const {
     if (!m_data) {

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexConvertedPart.h"
-#include "contracts/tarvex/TarvexPMIData.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexConvertedPart.h>
+#include <VizBridge/contracts/tarvex/TarvexPMIData.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexPartImportResult.h"
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 TarvexPMIData TarvexPartImportResult::GetPMIData() const {
     // Until the modeler set it, the result belongs to no model, and no plan can make it throw.

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexPMIData.h"
+#include <VizBridge/contracts/tarvex/TarvexPMIData.h>
 
 /// What a part import gives beside the modeler's container. Default-constructed by the
 /// caller; the modeler fills it.

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexPolicy.h"
+#include <VizBridge/contracts/tarvex/TarvexPolicy.h>
 
 bool TarvexPolicy::GetOption(std::string const& name, bool& value) const {
     auto const found = m_options.find(name);

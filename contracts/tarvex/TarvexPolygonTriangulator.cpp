@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexPolygonTriangulator.h"
+#include <VizBridge/contracts/tarvex/TarvexPolygonTriangulator.h>
 
 #include <algorithm>
 #include <cmath>

@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexSpoolerState.h"
+#include <VizBridge/contracts/tarvex/TarvexSpoolerState.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
-#include "contracts/tarvex/TarvexMultiProcess.h"
-#include "contracts/tarvex/TarvexPartConversion.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/contracts/tarvex/TarvexPartConversion.h>
 
 #include <algorithm>
 #include <set>

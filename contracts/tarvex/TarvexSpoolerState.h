@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredPartGeometry.h"
-#include "contracts/tarvex/TarvexRep.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredPartGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexRep.h>
 
 #include <atomic>
 #include <cstddef>

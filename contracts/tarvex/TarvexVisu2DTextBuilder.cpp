@@ -1,12 +1,12 @@
-#include "contracts/tarvex/TarvexVisu2DTextBuilder.h"
+#include <VizBridge/contracts/tarvex/TarvexVisu2DTextBuilder.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "contracts/tarvex/TarvexFontCache.h"
-#include "contracts/tarvex/TarvexGlyphSource.h"
-#include "contracts/tarvex/TarvexModelData.h"
-#include "contracts/tarvex/TarvexPolygonTriangulator.h"
-#include "contracts/tarvex/TarvexVisuFont.h"
-#include "contracts/tarvex/TarvexVisuText.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexFontCache.h>
+#include <VizBridge/contracts/tarvex/TarvexGlyphSource.h>
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
+#include <VizBridge/contracts/tarvex/TarvexPolygonTriangulator.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuText.h>
 
 #include <array>
 #include <cmath>

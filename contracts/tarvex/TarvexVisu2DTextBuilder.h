@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuBuild2DTextResult.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuBuild2DTextResult.h>
 
 class TarvexVisuFont;
 class TarvexVisuText;

@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexVisuAttributes.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuFont.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Attributes = TarvexAuthoredVisuAttributes;
 

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexVisuBuild2DTextResult.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuBuild2DTextResult.h>
 
 TarvexVisuEdgeIter TarvexVisuBuild2DTextResult::GetStrokedFontTextIterator() const {
     m_context.Check("TarvexVisuBuild2DTextResult::GetStrokedFontTextIterator");

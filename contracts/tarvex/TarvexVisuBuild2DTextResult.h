@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuFaceIter.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFaceIter.h>
 
 #include <memory>
 #include <vector>

@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexVisuCamera.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuCamera.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Camera = TarvexAuthoredVisuCamera;
 

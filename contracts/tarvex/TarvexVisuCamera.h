@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuContext.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
 
 #include <memory>
 

@@ -1,10 +1,10 @@
-#include "contracts/tarvex/TarvexVisuCapture.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuCapture.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexVisuCamera.h"
-#include "contracts/tarvex/TarvexVisuIDIter.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCamera.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIDIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Capture = TarvexAuthoredVisuCapture;
 

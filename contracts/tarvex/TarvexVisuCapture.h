@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexVisuCamera.h"
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuIDIter.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCamera.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIDIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexVisuCapture.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCapture.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
 
 /// The captures of visualisation data.
 class TarvexVisuCaptureIter : public TarvexVisuIterator<TarvexVisuCaptureIter, TarvexVisuCapture,

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexVisuContext.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 void TarvexVisuContext::Check(char const* operation) const {
     if (m_model) {

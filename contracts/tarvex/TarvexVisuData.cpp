@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexVisuData.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuData.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuData.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuData.h>
 
 TarvexVisuNodeIter TarvexVisuData::GetNodeIterator() const {
     TarvexAuthoredVisuData const* const data =

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuCaptureIter.h"
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuNodeIter.h"
-#include "contracts/tarvex/TarvexVisuViewIter.h"
-#include "contracts/tarvex/TarvexVisualizationData.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuCaptureIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNodeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuViewIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisualizationData.h>
 
 #include <memory>
 

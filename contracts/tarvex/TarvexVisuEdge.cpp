@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexVisuEdge.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuEdge.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Edge = TarvexAuthoredVisuEdge;
 

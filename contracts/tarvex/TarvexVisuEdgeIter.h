@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuEdge.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdge.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
 
 /// The edges of a mesh, wire or PMI, or the strokes of a laid-out text.
 class TarvexVisuEdgeIter

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexVisuEntity.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
 
-#include "contracts/tarvex/TarvexModelData.h"
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
 
 bool TarvexVisuEntity::GetID(TarvexWString& id) const {
     if (m_data) {

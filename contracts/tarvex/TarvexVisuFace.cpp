@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexVisuFace.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuFace.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuPolygonIter.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygonIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Face = TarvexAuthoredVisuFace;
 

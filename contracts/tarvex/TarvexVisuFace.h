@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuPolygonIter.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygonIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuFace.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFace.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
 
 /// The faces of a mesh, or the filled glyphs of a laid-out text.
 class TarvexVisuFaceIter

@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexVisuFont.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Font = TarvexAuthoredVisuFont;
 

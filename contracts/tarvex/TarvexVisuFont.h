@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

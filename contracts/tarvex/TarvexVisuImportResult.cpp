@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexVisuImportResult.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuImportResult.h>
 
 TarvexVisuData TarvexVisuImportResult::GetVisualizationData() const {
     m_context.Check("TarvexVisuImportResult::GetVisualizationData");

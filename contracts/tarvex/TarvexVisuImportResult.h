@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuData.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuData.h>
 
 /// What an import of visualisation data gives. A default object holds empty data.
 class TarvexVisuImportResult {

@@ -1,9 +1,9 @@
-#include "contracts/tarvex/TarvexVisuMesh.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuMesh.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuFaceIter.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFaceIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Mesh = TarvexAuthoredVisuMesh;
 

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuFaceIter.h"
-#include "contracts/tarvex/TarvexVisuGeometryType.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFaceIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuGeometryType.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

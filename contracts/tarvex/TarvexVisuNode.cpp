@@ -1,11 +1,11 @@
-#include "contracts/tarvex/TarvexVisuNode.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuData.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuMesh.h"
-#include "contracts/tarvex/TarvexVisuPMI.h"
-#include "contracts/tarvex/TarvexVisuPointSet.h"
-#include "contracts/tarvex/TarvexVisuWire.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuMesh.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPointSet.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuWire.h>
 
 #include <array>
 

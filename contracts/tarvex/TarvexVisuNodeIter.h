@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuData.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
-#include "contracts/tarvex/TarvexVisuNode.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
 
 /// The nodes of visualisation data, in walk order.
 class TarvexVisuNodeIter

@@ -1,10 +1,10 @@
-#include "contracts/tarvex/TarvexVisuPMI.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuPMI.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuTextIter.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuTextIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using PMI = TarvexAuthoredVisuPMI;
 

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuTextIter.h"
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuTextIter.h>
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 #include <memory>
 

@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexVisuPointSet.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuPointSet.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuPointsIter.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPointsIter.h>
 
 TarvexVisuGeometryType TarvexVisuPointSet::GetGeometryType() const {
     TarvexAuthoredVisuPointSet const* const set =

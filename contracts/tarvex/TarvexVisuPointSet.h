@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuContext.h"
-#include "contracts/tarvex/TarvexVisuGeometryType.h"
-#include "contracts/tarvex/TarvexVisuPointsIter.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuGeometryType.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPointsIter.h>
 
 #include <memory>
 

@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexVisuPoints.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuPoints.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Points = TarvexAuthoredVisuPoints;
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
-#include "contracts/tarvex/TarvexVisuPoints.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPoints.h>
 
 /// The points of a point set.
 class TarvexVisuPointsIter

@@ -1,7 +1,7 @@
-#include "contracts/tarvex/TarvexVisuPolygon.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygon.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 int TarvexVisuPolygon::GetPolygonIndices(int const*& indices, TarvexVisuPolygonType& type) const {
     TarvexAuthoredVisuPolygon const* const polygon =

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
-#include "contracts/tarvex/TarvexVisuPolygon.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygon.h>
 
 /// The polygons of a face.
 class TarvexVisuPolygonIter : public TarvexVisuIterator<TarvexVisuPolygonIter, TarvexVisuPolygon,

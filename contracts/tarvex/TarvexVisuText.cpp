@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexVisuText.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuText.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "contracts/tarvex/TarvexVisuFont.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 #include <algorithm>
 #include <array>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "contracts/tarvex/TarvexVisuIterator.h"
-#include "contracts/tarvex/TarvexVisuText.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIterator.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuText.h>
 
 /// The texts of a PMI.
 class TarvexVisuTextIter

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 bool TarvexVisuValues::Text(std::optional<VizPort::WString> const* value, TarvexWString& text) {
     if (value == nullptr || !*value) {

@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexVisuView.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuView.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexVisuIDIter.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIDIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using View = TarvexAuthoredVisuView;
 

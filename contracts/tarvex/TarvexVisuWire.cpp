@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexVisuWire.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuWire.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexVisuEdgeIter.h"
-#include "contracts/tarvex/TarvexVisuValues.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEdgeIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuValues.h>
 
 using Wire = TarvexAuthoredVisuWire;
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexLengthUnitType.h"
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
 
 class TarvexVisuCaptureIter;
 class TarvexVisuNodeIter;

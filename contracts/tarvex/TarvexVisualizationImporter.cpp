@@ -1,9 +1,9 @@
-#include "contracts/tarvex/TarvexVisualizationImporter.h"
+#include <VizBridge/contracts/tarvex/TarvexVisualizationImporter.h>
 
-#include "contracts/tarvex/TarvexAuthoredVisuData.h"
-#include "contracts/tarvex/TarvexModelData.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexPolicy.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexModelData.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexPolicy.h>
 
 #include <algorithm>
 #include <optional>

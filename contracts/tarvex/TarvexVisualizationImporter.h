@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuImportResult.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuImportResult.h>
 
 class TarvexPartDocument;
 class TarvexPolicy;

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexWString.h"
+#include <VizBridge/contracts/tarvex/TarvexWString.h>
 
 TarvexWString::TarvexWString(char16_t const* text) {
     if (text != nullptr) {

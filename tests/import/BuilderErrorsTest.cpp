@@ -1,5 +1,5 @@
-#include "import/BuilderErrors.h"
 #include "support/DebugCapture.h"
+#include <VizBridge/import/BuilderErrors.h>
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
-#include "contracts/tarvex/TarvexMultiProcess.h"
-#include "model/VizPSEntry.h"
 #include "support/BuildStructure.h"
 #include "support/DebugCapture.h"
 #include "support/ProgressRecorder.h"
 #include "support/ScriptedModeler.h"
 #include "support/VizBuilderTestPeer.h"
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/model/VizPSEntry.h>
 
 #include <gtest/gtest.h>
 
@@ -74,8 +74,10 @@ TEST(InstanceDataPhase, SingleProcessProgressWithoutModelerServices) {
         run.structure->GetErrorMessages(),
         (std::vector<WString>{u"Could not import Part 'PartP'.", u"Could not import Part 'PartQ'.",
                               u"Missing File /lost/m.prt"}));
-    EXPECT_EQ(debug.texts(), (std::vector<WString>{u"Error on RefID 10: ", u"Error on RefID 40: ",
-                                                   u"Error on RefID 10: "}));
+    EXPECT_EQ(debug.texts(),
+              (std::vector<WString>{
+                  u"VizBuilder: no modeler services are set, so no BREP part can be imported",
+                  u"Error on RefID 10: ", u"Error on RefID 40: ", u"Error on RefID 10: "}));
     EXPECT_EQ(run.builder.GetNumberOfProcessorsUsed(), 1);
 }
 

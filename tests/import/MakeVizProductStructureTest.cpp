@@ -1,8 +1,8 @@
-#include "contracts/tarvex/TarvexLengthUnitUtils.h"
-#include "model/VizPSEntry.h"
 #include "support/BuildStructure.h"
 #include "support/TestPartContainer.h"
 #include "support/VizProductStructureTestPeer.h"
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitUtils.h>
+#include <VizBridge/model/VizPSEntry.h>
 
 #include <gtest/gtest.h>
 

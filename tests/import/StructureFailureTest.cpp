@@ -1,7 +1,7 @@
-#include "contracts/kolba/AllowThrow.h"
-#include "model/VizPSEntry.h"
 #include "support/BuildStructure.h"
 #include "support/DebugCapture.h"
+#include <VizBridge/contracts/kolba/AllowThrow.h>
+#include <VizBridge/model/VizPSEntry.h>
 
 #include <gtest/gtest.h>
 

@@ -1,20 +1,20 @@
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexVisuData.h"
-#include "contracts/tarvex/TarvexVisuImportResult.h"
-#include "contracts/tarvex/TarvexVisualizationImporter.h"
-#include "import/VizBuilder.h"
-#include "model/VizProductStructure.h"
 #include "support/BuildStructure.h"
 #include "support/DebugCapture.h"
 #include "support/VizBuilderTestPeer.h"
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexVisualizationImporter.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizProductStructure.h>
 
 #include <gtest/gtest.h>
 

@@ -1,17 +1,17 @@
 // Makes a one-part structure around a host's own container through the installed headers
-// and library, and checks what came out.
+// and libraries, and checks what came out; then makes the installed reference modeler.
 
-#include "import/VizBuilder.h"
-#include "model/VizPSEntry.h"
-#include "model/VizPartContainer.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/import/UniqueProductStructure.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizPartContainer.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
 
 #include <iostream>
 #include <memory>
 
 namespace {
 
-using VizBridgeTarvex::VizBuilder;
 using VizBridgeTarvex::VizDocumentInfo;
 using VizBridgeTarvex::VizPartContainer;
 using VizBridgeTarvex::VizProductStructure;
@@ -30,15 +30,15 @@ public:
 int main() {
     VizDocumentInfo info;
     info.productName = u"ConsumerProduct";
-    VizProductStructure* raw = nullptr;
-    // The structure takes the container; the host takes the structure.
-    VizBuilder::MakeVizProductStructure(info, std::make_unique<ConsumerPart>().release(), raw);
-    std::unique_ptr<VizProductStructure> const structure(raw);
+    std::unique_ptr<VizProductStructure> const structure =
+        VizBridgeTarvex::MakeUniqueVizProductStructure(info, std::make_unique<ConsumerPart>());
+    VizReferenceModeler::ReferenceModelerServices modeler;
 
     bool const ok = structure != nullptr && structure->GetProductName() == u"ConsumerProduct" &&
                     structure->GetChildren().size() == 1 &&
                     structure->GetNumberOfVizPartContainers() == 1 &&
-                    structure->GetVizPartContainer(1)->GetTypeName() == "Consumer BREP Container";
+                    structure->GetVizPartContainer(1)->GetTypeName() == "Consumer BREP Container" &&
+                    modeler.GetName() == u"Reference Modeler";
     std::cout << (ok ? "consumer: VizBridge works from its install\n"
                      : "consumer: unexpected structure\n");
     return ok ? 0 : 1;

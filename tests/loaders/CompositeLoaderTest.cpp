@@ -1,13 +1,13 @@
 #include "LoaderTestSupport.h"
 
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizWire.h"
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
 #include "contracts/tarvex/TarvexVisuTestModel.h"
-#include "loaders/VizMeshLoader.h"
-#include "loaders/VizPointSetLoader.h"
-#include "loaders/VizWireLoader.h"
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/loaders/VizMeshLoader.h>
+#include <VizBridge/loaders/VizPointSetLoader.h>
+#include <VizBridge/loaders/VizWireLoader.h>
 
 #include <gtest/gtest.h>
 

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "contracts/tarvex/TarvexFault.h"
-#include "contracts/tarvex/TarvexVisuPMI.h"
 #include "contracts/tarvex/TarvexVisuTestModel.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexFault.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPMI.h>
 
 #include <optional>
 #include <string>

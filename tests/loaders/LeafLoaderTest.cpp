@@ -1,12 +1,12 @@
 #include "LoaderTestSupport.h"
 
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizPoints.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "loaders/VizEdgeLoader.h"
-#include "loaders/VizPointsLoader.h"
-#include "loaders/VizPolygonLoader.h"
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/loaders/VizEdgeLoader.h>
+#include <VizBridge/loaders/VizPointsLoader.h>
+#include <VizBridge/loaders/VizPolygonLoader.h>
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/kolba/AVizElementLoader.h"
-#include "contracts/kolba/RGBAColor.h"
-#include "contracts/tarvex/TarvexAuthoredVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuContext.h"
+#include <VizBridge/contracts/kolba/AVizElementLoader.h>
+#include <VizBridge/contracts/kolba/RGBAColor.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
 
 #include <array>
 #include <cstdint>

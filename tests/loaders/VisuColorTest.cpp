@@ -1,8 +1,8 @@
 #include "LoaderTestSupport.h"
 
-#include "contracts/tarvex/TarvexAuthoredVisuGeometry.h"
-#include "contracts/tarvex/TarvexAuthoredVisuPMI.h"
-#include "loaders/VisuColor.h"
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuGeometry.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
+#include <VizBridge/loaders/VisuColor.h>
 
 #include <gtest/gtest.h>
 

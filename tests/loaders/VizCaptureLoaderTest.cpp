@@ -1,10 +1,10 @@
 #include "ImportedVisu.h"
 #include "LoaderTestSupport.h"
 
-#include "contracts/kolba/VizCapture.h"
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexVisuCapture.h"
-#include "loaders/VizCaptureLoader.h"
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCapture.h>
+#include <VizBridge/loaders/VizCaptureLoader.h>
 
 #include <gtest/gtest.h>
 

@@ -1,12 +1,13 @@
 #include "ImportedVisu.h"
 #include "LoaderTestSupport.h"
+#include "support/DebugCapture.h"
 
-#include "contracts/kolba/EntityType.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizText.h"
-#include "loaders/VizPMILoader.h"
+#include <VizBridge/contracts/kolba/EntityType.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/loaders/VizPMILoader.h>
 
 #include <gtest/gtest.h>
 
@@ -153,9 +154,12 @@ TEST_P(VizPMILoaderTessellationFailureTest,
     TarvexVisuPMI const source = visu.PMI(record);
     // The PMI's own edges take one call; then three strokes of "HHHH" are made.
     visu.FailOnce("TarvexVisuEdgeIter::Next", 1 + 3, GetParam());
+    DebugCapture debug;
     std::unique_ptr<VizPMI> const pmi = Load(source, nullptr, true);
     ASSERT_TRUE(pmi);
     EXPECT_EQ(visu.test.model.Faults().GetFiredCount(), 1);
+    ASSERT_EQ(debug.texts().size(), 1u);
+    EXPECT_EQ(debug.texts()[0].rfind(u"Failed to Tesselate Text: ", 0), 0u) << "with its reason";
     EXPECT_EQ(Strings(pmi->GetTexts()),
               std::vector<VizPort::WString>{u"Failed to Tesselate Text!"});
     EXPECT_EQ(pmi->GetEdges().size(), 1u) << "only the stroke of the second text";

@@ -1,10 +1,10 @@
 #include "ImportedVisu.h"
 #include "LoaderTestSupport.h"
 
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizText.h"
-#include "loaders/VizTextLoader.h"
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/loaders/VizTextLoader.h>
 
 #include <gtest/gtest.h>
 

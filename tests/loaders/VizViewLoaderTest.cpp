@@ -1,9 +1,9 @@
 #include "LoaderTestSupport.h"
 
-#include "contracts/kolba/VizView.h"
-#include "contracts/tarvex/TarvexAuthoredVisuView.h"
-#include "contracts/tarvex/TarvexVisuView.h"
-#include "loaders/VizViewLoader.h"
+#include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuView.h>
+#include <VizBridge/loaders/VizViewLoader.h>
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
-#include "model/VizPSEntry.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "model/VizPSInstanceBuilder.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/import/VizPSInstanceBuilder.h>
+#include <VizBridge/model/VizPSEntry.h>
 
 #include <gtest/gtest.h>
 

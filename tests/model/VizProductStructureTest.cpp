@@ -1,7 +1,8 @@
-#include "model/VizProductStructure.h"
-#include "model/VizPSEntry.h"
+#include "support/BuildStructure.h"
 #include "support/TestPartContainer.h"
 #include "support/VizProductStructureTestPeer.h"
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/model/VizProductStructure.h>
 
 #include <gtest/gtest.h>
 
@@ -46,13 +47,16 @@ TEST(VizProductStructure, LoadedStatesFollowTheContainerMaps) {
     EXPECT_FALSE(s->IsAllVizLoaded());
 }
 
-TEST(VizProductStructure, NullContainersAreNotStored) {
+TEST(VizProductStructure, NullContainersStandUnderTheirKeyAsNull) {
     auto s = Peer::make(u"P");
     Peer::addVizContainer(*s, 1, nullptr);
     Peer::addPMIContainer(*s, 1, nullptr);
     Peer::addPartContainer(*s, 1, nullptr);
-    EXPECT_FALSE(s->IsVizLoaded(1));
-    EXPECT_FALSE(s->IsBREPLoaded(1));
+    EXPECT_TRUE(s->IsVizLoaded(1));
+    EXPECT_TRUE(s->IsBREPLoaded(1));
+    EXPECT_EQ(s->GetVizPartContainer(1), nullptr);
+    EXPECT_FALSE(s->IsSemanticInfoLoaded(1));
+    EXPECT_EQ(s->GetSemanticPMIAsString(u"key"), u"");
 }
 
 TEST(VizProductStructure, ErrorMessagesComeInTheirFixedOrder) {
@@ -180,26 +184,67 @@ TEST(VizProductStructure, OverwrittenContainersStayValidUntilTheStructureGoes) {
     EXPECT_EQ(TestPartContainer::alive(), before) << "each freed once";
 }
 
-TEST(VizProductStructure, CopiesShareOwnershipAndMayBeDestroyedInAnyOrder) {
+/// A sub-assembly (id 5) with a part (id 2) placed twice, and the part's container.
+std::unique_ptr<VizProductStructure> assemblyWithPart() {
+    TarvexModel model;
+    model.SetProductName(u"P");
+    model.AddPart(2, u"Part");
+    model.AddAssembly(5, u"Sub");
+    model.AddInstance(5, 2, u"Part.1");
+    model.AddInstance(5, 2, u"Part.2");
+    model.AddRootInstance(5, u"Sub.1");
+    std::unique_ptr<VizProductStructure> structure = buildStructure(model);
+    Peer::addPartContainer(*structure, 2, new TestPartContainer(u"part", 2));
+    return structure;
+}
+
+/// Every entry of the tree, depth first.
+void collect(std::vector<VizPSEntry*> const& entries, std::vector<VizPSEntry*>& out) {
+    for (VizPSEntry* const entry : entries) {
+        out.push_back(entry);
+        collect(entry->GetChildren(), out);
+    }
+}
+
+TEST(VizProductStructure, ACopyHasItsOwnTreeAndSharesTheContainers) {
     int const before = TestPartContainer::alive();
     for (bool originalFirst : {true, false}) {
-        auto original = Peer::make(u"P");
-        auto* part = new TestPartContainer(u"p", 1);
-        Peer::addPartContainer(*original, 1, part);
+        SCOPED_TRACE(originalFirst ? "original deleted first" : "copy deleted first");
+        std::unique_ptr<VizProductStructure> original = assemblyWithPart();
+        WString const tree = original->ToString();
         auto copy = std::make_unique<VizProductStructure>(*original);
-        EXPECT_EQ(copy->GetVizPartContainer(1), part);
-        EXPECT_EQ(copy->GetProductName(), u"P");
+        VizPartContainer* const part = original->GetVizPartContainer(2);
         (originalFirst ? original : copy).reset();
+        VizProductStructure const& kept = originalFirst ? *copy : *original;
+
+        std::vector<VizPSEntry*> entries;
+        collect(kept.GetChildren(), entries);
+        ASSERT_EQ(entries.size(), 3u);
+        for (VizPSEntry const* const entry : entries)
+            EXPECT_EQ(entry->GetProductStructure(), &kept);
+        EXPECT_EQ(entries[1]->GetVizPartContainer(), part);
+        EXPECT_EQ(kept.GetSubAssembly(2), entries[1]);
+        EXPECT_EQ(kept.ToString(), tree);
         EXPECT_EQ(TestPartContainer::alive(), before + 1);
         (originalFirst ? copy : original).reset();
         EXPECT_EQ(TestPartContainer::alive(), before);
     }
-    auto a = Peer::make(u"A");
-    auto b = Peer::make(u"B");
-    Peer::addPartContainer(*b, 1, new TestPartContainer(u"b", 1));
-    *a = *b; // a's own objects go (none here), b's are shared
-    b.reset();
-    EXPECT_EQ(a->GetVizPartContainer(1)->GetName(), u"b");
+}
+
+TEST(VizProductStructure, AnAssignedStructureOutlivesItsSourceAndSharesRemovals) {
+    std::unique_ptr<VizProductStructure> source = assemblyWithPart();
+    auto target = Peer::make(u"T");
+    Peer::addPartContainer(*target, 9, new TestPartContainer(u"old", 9));
+    *target = *source;
+    EXPECT_EQ(target->GetVizPartContainer(9), nullptr) << "the target's own map is gone";
+
+    // A container given back through one of them is gone from both.
+    std::unique_ptr<VizPartContainer> const removed(source->GetVizPartContainer(2));
+    source->RemoveVizPartContainer(removed.get());
+    EXPECT_FALSE(target->IsBREPLoaded(2));
+    source.reset();
+    EXPECT_EQ(target->GetSubAssembly(2)->GetProductStructure(), target.get());
+    EXPECT_EQ(target->GetSubAssembly(2)->GetVizPartContainer(), nullptr);
 }
 
 TEST(VizPartContainer, TypeNameIsTheModelerTypeAndTheSuffix) {

@@ -1,15 +1,15 @@
-#include "render/AVizRenderer.h"
-#include "contracts/kolba/ConstructionContext.h"
-#include "contracts/kolba/GeometryItem.h"
-#include "contracts/kolba/PolygonItem.h"
-#include "contracts/kolba/SceneContext.h"
-#include "contracts/kolba/SceneLevelContext.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizPoints.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/kolba/VizWire.h"
 #include "support/RenderFixture.h"
 #include "support/ScriptedModeler.h"
+#include <VizBridge/contracts/kolba/ConstructionContext.h>
+#include <VizBridge/contracts/kolba/GeometryItem.h>
+#include <VizBridge/contracts/kolba/PolygonItem.h>
+#include <VizBridge/contracts/kolba/SceneContext.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/render/AVizRenderer.h>
 
 #include <gtest/gtest.h>
 

@@ -1,11 +1,11 @@
-#include "contracts/kolba/AllowThrow.h"
-#include "contracts/kolba/Dbg.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "render/TarvexRenderer.h"
 #include "support/BrepTestModeler.h"
 #include "support/BuildStructure.h"
 #include "support/RenderFixture.h"
 #include "support/VizProductStructureTestPeer.h"
+#include <VizBridge/contracts/kolba/AllowThrow.h>
+#include <VizBridge/contracts/kolba/Dbg.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/render/TarvexRenderer.h>
 
 #include <gtest/gtest.h>
 
@@ -193,6 +193,12 @@ TEST_F(TarvexRendererFrame, PreRenderRefusesANullStructureAndOtherwiseStartsAfre
     EXPECT_FALSE(none.Render());
     EXPECT_EQ(dbg.text(), "TarvexRenderer::Render : the renderer has no product structure\n");
     EXPECT_EQ(TarvexRenderer::MakeRenderer(nullptr, nullptr, &scene.builder, 0, 0, 0), nullptr);
+
+    TarvexRendererProbe blind(structure.get(), nullptr, nullptr);
+    DbgCapture noBuilder;
+    EXPECT_TRUE(blind.Render()) << "nothing refused the walk: it only had nowhere to draw";
+    EXPECT_EQ(noBuilder.text(),
+              "TarvexRenderer::Render : the renderer has no scene builder, so nothing is drawn\n");
 
     TarvexRendererProbe renderer(structure.get(), &scene.builder, nullptr);
     ASSERT_TRUE(renderer.Render());

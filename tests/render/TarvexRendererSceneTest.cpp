@@ -1,11 +1,11 @@
-#include "contracts/kolba/Dbg.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "model/VizPSEntry.h"
-#include "render/SameRenderId.h"
 #include "support/BrepTestModeler.h"
 #include "support/BuildStructure.h"
 #include "support/RenderFixture.h"
 #include "support/VizProductStructureTestPeer.h"
+#include <VizBridge/contracts/kolba/Dbg.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/model/VizPSEntry.h>
+#include <VizBridge/render/SameRenderId.h>
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/kolba/AGeometryItemFactory.h"
-#include "contracts/kolba/ARenderer.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/SceneLevelContext.h"
 #include "support/ScriptedModeler.h"
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/ARenderer.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
 
 #include <cstdint>
 #include <stdexcept>

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "import/VizBuilder.h"
-#include "model/VizProductStructure.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizProductStructure.h>
 
 #include <memory>
 

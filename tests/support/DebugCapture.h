@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/platform/DebugOutput.h"
+#include <VizBridge/contracts/platform/DebugOutput.h>
 
 #include <vector>
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <optional>
 #include <ostream>

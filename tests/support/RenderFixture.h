@@ -3,15 +3,15 @@
 // A scene to render into, hand-made elements and a window onto TarvexRenderer's records,
 // for the renderer tests.
 
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
-#include "contracts/kolba/RecordingView3D.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/View3DAdapter.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "render/TarvexRenderer.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/RecordingView3D.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/View3DAdapter.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/render/TarvexRenderer.h>
 
 #include <cstdint>
 #include <initializer_list>

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexPartImportResult.h"
-#include "services/VizModelerServices.h"
 #include "support/TestPartContainer.h"
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
+#include <VizBridge/services/VizModelerServices.h>
 
 #include <map>
 #include <stdexcept>

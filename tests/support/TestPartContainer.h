@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/VizPartContainer.h"
+#include <VizBridge/model/VizPartContainer.h>
 
 namespace VizBridgeTarvex {
 

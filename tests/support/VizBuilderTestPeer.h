@@ -1,6 +1,6 @@
 #pragma once
 
-#include "import/VizBuilder.h"
+#include <VizBridge/import/VizBuilder.h>
 
 namespace VizBridgeTarvex {
 

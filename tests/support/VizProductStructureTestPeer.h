@@ -1,6 +1,7 @@
 #pragma once
 
-#include "model/VizProductStructure.h"
+#include <VizBridge/model/VizPartContainer.h>
+#include <VizBridge/model/VizProductStructure.h>
 
 #include <memory>
 
@@ -13,13 +14,13 @@ public:
         return std::unique_ptr<VizProductStructure>(new VizProductStructure(name));
     }
     static void addVizContainer(VizProductStructure& s, int id, VizContainer* c) {
-        s.AddVizContainer(id, c);
+        s.AddVizContainer(id, std::unique_ptr<VizContainer>(c));
     }
     static void addPMIContainer(VizProductStructure& s, int id, VizPMIContainer* c) {
-        s.AddVizPMIContainer(id, c);
+        s.AddVizPMIContainer(id, std::unique_ptr<VizPMIContainer>(c));
     }
     static void addPartContainer(VizProductStructure& s, int id, VizPartContainer* c) {
-        s.AddVizPartContainer(id, c);
+        s.AddVizPartContainer(id, std::unique_ptr<VizPartContainer>(c));
     }
     static void addSemanticPMI(VizProductStructure& s, int id, SemanticPMIByKey* records) {
         s.AddSemanticPMI(id, records);

@@ -1,9 +1,9 @@
-#include "contracts/kolba/ARenderer.h"
+#include <VizBridge/contracts/kolba/ARenderer.h>
 
-#include "contracts/kolba/Ray.h"
-#include "contracts/kolba/RecordingView3D.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/View3DAdapter.h"
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/RecordingView3D.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/View3DAdapter.h>
 
 #include "SceneTestScene.h"
 

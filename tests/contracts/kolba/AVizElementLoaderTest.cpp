@@ -1,14 +1,14 @@
-#include "contracts/kolba/AVizCaptureLoader.h"
-#include "contracts/kolba/AVizEdgeLoader.h"
-#include "contracts/kolba/AVizFaceLoader.h"
-#include "contracts/kolba/AVizMeshLoader.h"
-#include "contracts/kolba/AVizPMILoader.h"
-#include "contracts/kolba/AVizPointSetLoader.h"
-#include "contracts/kolba/AVizPointsLoader.h"
-#include "contracts/kolba/AVizPolygonLoader.h"
-#include "contracts/kolba/AVizTextLoader.h"
-#include "contracts/kolba/AVizViewLoader.h"
-#include "contracts/kolba/AVizWireLoader.h"
+#include <VizBridge/contracts/kolba/AVizCaptureLoader.h>
+#include <VizBridge/contracts/kolba/AVizEdgeLoader.h>
+#include <VizBridge/contracts/kolba/AVizFaceLoader.h>
+#include <VizBridge/contracts/kolba/AVizMeshLoader.h>
+#include <VizBridge/contracts/kolba/AVizPMILoader.h>
+#include <VizBridge/contracts/kolba/AVizPointSetLoader.h>
+#include <VizBridge/contracts/kolba/AVizPointsLoader.h>
+#include <VizBridge/contracts/kolba/AVizPolygonLoader.h>
+#include <VizBridge/contracts/kolba/AVizTextLoader.h>
+#include <VizBridge/contracts/kolba/AVizViewLoader.h>
+#include <VizBridge/contracts/kolba/AVizWireLoader.h>
 
 #include "CountedElement.h"
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/EntityId.h"
+#include <VizBridge/contracts/kolba/EntityId.h>
 
 #include <gtest/gtest.h>
 

@@ -1,11 +1,11 @@
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
 
-#include "contracts/kolba/LineSetItem.h"
-#include "contracts/kolba/Matrix4.h"
-#include "contracts/kolba/PolygonItem.h"
-#include "contracts/kolba/Ray.h"
-#include "contracts/kolba/TextItem.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/LineSetItem.h>
+#include <VizBridge/contracts/kolba/Matrix4.h>
+#include <VizBridge/contracts/kolba/PolygonItem.h>
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/TextItem.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <gtest/gtest.h>
 

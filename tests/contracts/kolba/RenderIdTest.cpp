@@ -1,4 +1,4 @@
-#include "contracts/kolba/RenderId.h"
+#include <VizBridge/contracts/kolba/RenderId.h>
 
 #include <gtest/gtest.h>
 

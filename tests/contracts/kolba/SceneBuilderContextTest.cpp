@@ -1,8 +1,8 @@
-#include "contracts/kolba/ASceneBuilderContext.h"
+#include <VizBridge/contracts/kolba/ASceneBuilderContext.h>
 
 #include "SceneTestScene.h"
-#include "contracts/kolba/ConstructionContext.h"
-#include "contracts/kolba/EntityContext.h"
+#include <VizBridge/contracts/kolba/ConstructionContext.h>
+#include <VizBridge/contracts/kolba/EntityContext.h>
 
 #include <gtest/gtest.h>
 

@@ -1,11 +1,11 @@
-#include "contracts/kolba/SceneBuilder.h"
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
 
 #include "SceneTestScene.h"
-#include "contracts/kolba/ConstructionContext.h"
-#include "contracts/kolba/EntityContext.h"
-#include "contracts/kolba/GeometryItem.h"
-#include "contracts/kolba/Ray.h"
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/ConstructionContext.h>
+#include <VizBridge/contracts/kolba/EntityContext.h>
+#include <VizBridge/contracts/kolba/GeometryItem.h>
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <gtest/gtest.h>
 

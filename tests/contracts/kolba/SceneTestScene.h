@@ -3,14 +3,14 @@
 // A small product scene shared by the scene builder tests: "ROOT" / product 77 / two
 // instances of one part, the second showing the first's "Part" node through a reference.
 
-#include "contracts/kolba/BodyContext.h"
-#include "contracts/kolba/ContainerContext.h"
-#include "contracts/kolba/EntityType.h"
-#include "contracts/kolba/EntityTypeContext.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/SceneContext.h"
-#include "contracts/kolba/SceneLevelContext.h"
-#include "contracts/kolba/VizTransf.h"
+#include <VizBridge/contracts/kolba/BodyContext.h>
+#include <VizBridge/contracts/kolba/ContainerContext.h>
+#include <VizBridge/contracts/kolba/EntityType.h>
+#include <VizBridge/contracts/kolba/EntityTypeContext.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneContext.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/kolba/VizTransf.h>
 
 #include <cstdint>
 #include <initializer_list>

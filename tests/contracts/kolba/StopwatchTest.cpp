@@ -1,4 +1,4 @@
-#include "contracts/kolba/Stopwatch.h"
+#include <VizBridge/contracts/kolba/Stopwatch.h>
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizBox.h"
+#include <VizBridge/contracts/kolba/VizBox.h>
 
 #include <gtest/gtest.h>
 

@@ -1,12 +1,12 @@
-#include "contracts/kolba/VizContainer.h"
-#include "contracts/kolba/VizEdge.h"
-#include "contracts/kolba/VizFace.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPointSet.h"
-#include "contracts/kolba/VizPoints.h"
-#include "contracts/kolba/VizPolygon.h"
-#include "contracts/kolba/VizText.h"
-#include "contracts/kolba/VizWire.h"
+#include <VizBridge/contracts/kolba/VizContainer.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizPoints.h>
+#include <VizBridge/contracts/kolba/VizPolygon.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
 
 #include <gtest/gtest.h>
 

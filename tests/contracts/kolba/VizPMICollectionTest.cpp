@@ -1,8 +1,8 @@
-#include "contracts/kolba/VizPMICollection.h"
-#include "contracts/kolba/VizCapture.h"
-#include "contracts/kolba/VizMesh.h"
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizView.h"
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPMICollection.h>
+#include <VizBridge/contracts/kolba/VizView.h>
 
 #include <gtest/gtest.h>
 

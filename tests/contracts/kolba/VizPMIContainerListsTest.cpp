@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizPMIContainer.h"
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
 
 #include "CountedElement.h"
 

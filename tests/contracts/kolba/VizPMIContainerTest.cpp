@@ -1,7 +1,7 @@
-#include "contracts/kolba/VizPMIContainer.h"
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
 
-#include "contracts/kolba/Ray.h"
-#include "contracts/kolba/VizContainer.h"
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/VizContainer.h>
 
 #include <gtest/gtest.h>
 

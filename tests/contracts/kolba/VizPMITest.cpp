@@ -1,5 +1,5 @@
-#include "contracts/kolba/VizPMI.h"
-#include "contracts/kolba/VizPMIType.h"
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPMIType.h>
 
 #include "CountedElement.h"
 

@@ -1,4 +1,4 @@
-#include "contracts/kolba/VizTransf.h"
+#include <VizBridge/contracts/kolba/VizTransf.h>
 
 #include <gtest/gtest.h>
 

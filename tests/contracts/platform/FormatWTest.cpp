@@ -1,4 +1,4 @@
-#include "contracts/platform/FormatW.h"
+#include <VizBridge/contracts/platform/FormatW.h>
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "contracts/platform/RecursiveLock.h"
+#include <VizBridge/contracts/platform/RecursiveLock.h>
 
 #include <gtest/gtest.h>
 

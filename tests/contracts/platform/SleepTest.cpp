@@ -1,4 +1,4 @@
-#include "contracts/platform/Sleep.h"
+#include <VizBridge/contracts/platform/Sleep.h>
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "contracts/platform/WString.h"
+#include <VizBridge/contracts/platform/WString.h>
 
 #include <gtest/gtest.h>
 

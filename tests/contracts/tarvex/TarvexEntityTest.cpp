@@ -1,13 +1,13 @@
 #include "TarvexTestText.h"
 
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexInstanceEntity.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPMIAnnotation.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexPartImportResult.h"
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
 
 #include <gtest/gtest.h>
 

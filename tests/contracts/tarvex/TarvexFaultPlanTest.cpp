@@ -1,9 +1,9 @@
-#include "contracts/tarvex/TarvexFaultPlan.h"
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexFaultPlan.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
 
 #include <gtest/gtest.h>
 

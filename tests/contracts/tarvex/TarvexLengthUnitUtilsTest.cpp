@@ -1,6 +1,6 @@
 #include "TarvexTestText.h"
 
-#include "contracts/tarvex/TarvexLengthUnitUtils.h"
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitUtils.h>
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
-#include "contracts/tarvex/TarvexPolygonTriangulator.h"
-#include "contracts/tarvex/TarvexFontCache.h"
-#include "contracts/tarvex/TarvexGlyphSource.h"
+#include <VizBridge/contracts/tarvex/TarvexFontCache.h>
+#include <VizBridge/contracts/tarvex/TarvexGlyphSource.h>
+#include <VizBridge/contracts/tarvex/TarvexPolygonTriangulator.h>
 
 #include <gtest/gtest.h>
 

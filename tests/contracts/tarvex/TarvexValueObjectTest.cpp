@@ -1,11 +1,11 @@
 #include "TarvexTestText.h"
 
-#include "contracts/tarvex/TarvexDocument.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPSImportResult.h"
-#include "contracts/tarvex/TarvexPolicy.h"
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexPolicy.h>
 
 #include <gtest/gtest.h>
 

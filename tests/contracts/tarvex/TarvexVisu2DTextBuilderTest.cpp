@@ -1,9 +1,9 @@
 #include "TarvexVisuTestModel.h"
 
-#include "contracts/tarvex/TarvexFontCache.h"
-#include "contracts/tarvex/TarvexVisu2DTextBuilder.h"
-#include "contracts/tarvex/TarvexVisuPolygonIter.h"
-#include "contracts/tarvex/TarvexVisuTextIter.h"
+#include <VizBridge/contracts/tarvex/TarvexFontCache.h>
+#include <VizBridge/contracts/tarvex/TarvexVisu2DTextBuilder.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygonIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuTextIter.h>
 
 #include <gtest/gtest.h>
 

@@ -1,23 +1,23 @@
 #include "TarvexTestText.h"
 #include "TarvexVisuTestModel.h"
 
-#include "contracts/tarvex/TarvexEntityIter.h"
-#include "contracts/tarvex/TarvexInstanceEntity.h"
-#include "contracts/tarvex/TarvexPolicy.h"
-#include "contracts/tarvex/TarvexVisuAttributes.h"
-#include "contracts/tarvex/TarvexVisuCamera.h"
-#include "contracts/tarvex/TarvexVisuCapture.h"
-#include "contracts/tarvex/TarvexVisuEntity.h"
-#include "contracts/tarvex/TarvexVisuFont.h"
-#include "contracts/tarvex/TarvexVisuIDIter.h"
-#include "contracts/tarvex/TarvexVisuMesh.h"
-#include "contracts/tarvex/TarvexVisuPMI.h"
-#include "contracts/tarvex/TarvexVisuPointSet.h"
-#include "contracts/tarvex/TarvexVisuPointsIter.h"
-#include "contracts/tarvex/TarvexVisuPolygonIter.h"
-#include "contracts/tarvex/TarvexVisuTextIter.h"
-#include "contracts/tarvex/TarvexVisuView.h"
-#include "contracts/tarvex/TarvexVisuWire.h"
+#include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexPolicy.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCamera.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCapture.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuIDIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuMesh.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPMI.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPointSet.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPointsIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuPolygonIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuTextIter.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuView.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuWire.h>
 
 #include <gtest/gtest.h>
 

@@ -1,9 +1,9 @@
 #include "TarvexVisuTestModel.h"
 
-#include "contracts/tarvex/TarvexPolicy.h"
-#include "contracts/tarvex/TarvexVisu2DTextBuilder.h"
-#include "contracts/tarvex/TarvexVisuCapture.h"
-#include "contracts/tarvex/TarvexVisuView.h"
+#include <VizBridge/contracts/tarvex/TarvexPolicy.h>
+#include <VizBridge/contracts/tarvex/TarvexVisu2DTextBuilder.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuCapture.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuView.h>
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "contracts/tarvex/TarvexVisuNode.h"
+#include <VizBridge/contracts/tarvex/TarvexVisuNode.h>
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexVisuData.h"
-#include "contracts/tarvex/TarvexVisualizationImporter.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuData.h>
+#include <VizBridge/contracts/tarvex/TarvexVisualizationImporter.h>
 
 #include <vector>
 

@@ -1,12 +1,13 @@
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
 
-#include "contracts/tarvex/TarvexEntity.h"
-#include "contracts/tarvex/TarvexInstanceEntity.h"
-#include "contracts/tarvex/TarvexPMIAnnotation.h"
-#include "contracts/tarvex/TarvexPartDocument.h"
-#include "contracts/tarvex/TarvexPartImportResult.h"
-#include "examples/ReferenceModeler/ReferenceBrepRenderer.h"
-#include "examples/ReferenceModeler/ReferencePartContainer.h"
+#include <VizBridge/contracts/tarvex/TarvexEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
+#include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
+#include <VizBridge/model/BoxTransform.h>
+#include <VizBridge/referencemodeler/ReferenceBrepRenderer.h>
+#include <VizBridge/referencemodeler/ReferencePartContainer.h>
 
 #include <cstdint>
 #include <memory>
@@ -98,17 +99,7 @@ VizBox ReferenceModelerServices::ExplodeBox(VizTransf const& transformation, Viz
                                             double const& x, double const& y, double const& z) {
     if (box.IsEmpty())
         return box;
-    double const* const low = box.GetLow();
-    double const* const high = box.GetHigh();
-    // A rotation moves the corners off the axes: the moved box is the one around all eight.
-    VizBox moved;
-    for (int corner = 0; corner < 8; ++corner) {
-        double const point[3] = {(corner & 1) ? high[0] : low[0], (corner & 2) ? high[1] : low[1],
-                                 (corner & 4) ? high[2] : low[2]};
-        double mapped[3];
-        transformation.Apply(point, mapped);
-        moved.Add(mapped);
-    }
+    VizBox const moved = VizBridgeTarvex::TransformBox(transformation, box);
     double center[3];
     moved.GetCenter(center);
     double const factors[3] = {x, y, z};

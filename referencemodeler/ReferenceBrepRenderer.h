@@ -1,8 +1,8 @@
 #pragma once
 
-#include "contracts/kolba/ARenderer.h"
-#include "contracts/kolba/EntityId.h"
-#include "contracts/kolba/RenderId.h"
+#include <VizBridge/contracts/kolba/ARenderer.h>
+#include <VizBridge/contracts/kolba/EntityId.h>
+#include <VizBridge/contracts/kolba/RenderId.h>
 
 #include <cstdint>
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "services/VizModelerServices.h"
+#include <VizBridge/services/VizModelerServices.h>
 
 #include <map>
 #include <mutex>

@@ -1,4 +1,4 @@
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "examples/ReferenceModeler/ReferencePartContainer.h"
+#include <VizBridge/referencemodeler/ReferencePartContainer.h>
 
 #include <utility>
 

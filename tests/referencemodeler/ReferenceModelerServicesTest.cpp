@@ -1,12 +1,12 @@
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
-#include "examples/ReferenceModeler/ReferencePartContainer.h"
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
+#include <VizBridge/referencemodeler/ReferencePartContainer.h>
 
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPMIAnnotation.h"
-#include "contracts/tarvex/TarvexPartImportResult.h"
 #include "support/TestPartContainer.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
 
 #include <gtest/gtest.h>
 

@@ -1,30 +1,19 @@
-#include "model/VizPSInstanceBuilder.h"
+#include <VizBridge/import/VizPSInstanceBuilder.h>
 
-#include "contracts/tarvex/TarvexInputPSInstance.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "model/VizPSEntry.h"
+#include <VizBridge/contracts/tarvex/TarvexInputPSInstance.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/loaders/TarvexValues.h>
+#include <VizBridge/model/VizPSEntry.h>
 
 #include <memory>
 
 namespace VizBridgeTarvex {
 
-namespace {
-WString textOf(TarvexWString const& text) {
-    char16_t const* characters = nullptr;
-    text.ToWChar(characters);
-    return characters ? WString(characters) : WString();
-}
-
-std::uint8_t lowByte(unsigned short value) {
-    return static_cast<std::uint8_t>(value & 0xFFu);
-}
-} // namespace
-
 void VizPSInstanceBuilder::MakeVizPSInstance(TarvexInputPSInstance const& instance,
                                              TarvexInputPSReference const& reference,
                                              VizPSEntry*& out) {
-    WString const referenceName = textOf(reference.GetReferenceName());
-    WString const instanceName = textOf(instance.GetInstanceName());
+    WString const referenceName = textOrEmpty(reference.GetReferenceName());
+    WString const instanceName = textOrEmpty(instance.GetInstanceName());
     bool const isPart = reference.IsPart();
     unsigned long const id = reference.GetUniqueID();
 
@@ -50,12 +39,12 @@ void VizPSInstanceBuilder::MakeVizPSInstance(TarvexInputPSInstance const& instan
 
     RGBAColor color = entry->GetColor();
     if (hasColor) {
-        color.red = lowByte(red);
-        color.green = lowByte(green);
-        color.blue = lowByte(blue);
+        color.red = colorByte(red);
+        color.green = colorByte(green);
+        color.blue = colorByte(blue);
     }
     if (hasAlphaValue)
-        color.alpha = lowByte(alpha);
+        color.alpha = colorByte(alpha);
     entry->SetColorState(hasColor, color);
 
     out = entry.release(); // the caller owns it now

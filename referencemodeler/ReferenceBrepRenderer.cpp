@@ -1,16 +1,16 @@
-#include "examples/ReferenceModeler/ReferenceBrepRenderer.h"
+#include <VizBridge/referencemodeler/ReferenceBrepRenderer.h>
 
-#include "contracts/kolba/AGeometryItemFactory.h"
-#include "contracts/kolba/BodyContext.h"
-#include "contracts/kolba/EntityContext.h"
-#include "contracts/kolba/EntityType.h"
-#include "contracts/kolba/EntityTypeContext.h"
-#include "contracts/kolba/Node.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/SceneLevelContext.h"
-#include "contracts/kolba/TriangleType.h"
-#include "contracts/kolba/VizBox.h"
-#include "examples/ReferenceModeler/ReferencePartContainer.h"
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/BodyContext.h>
+#include <VizBridge/contracts/kolba/EntityContext.h>
+#include <VizBridge/contracts/kolba/EntityType.h>
+#include <VizBridge/contracts/kolba/EntityTypeContext.h>
+#include <VizBridge/contracts/kolba/Node.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/kolba/TriangleType.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
+#include <VizBridge/referencemodeler/ReferencePartContainer.h>
 
 #include <cmath>
 #include <initializer_list>

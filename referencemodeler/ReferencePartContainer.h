@@ -1,7 +1,7 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexConvertedPart.h"
-#include "model/VizPartContainer.h"
+#include <VizBridge/contracts/tarvex/TarvexConvertedPart.h>
+#include <VizBridge/model/VizPartContainer.h>
 
 #include <cstddef>
 #include <map>

@@ -1,19 +1,19 @@
-#include "examples/ReferenceModeler/ReferenceBrepRenderer.h"
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
-#include "examples/ReferenceModeler/ReferencePartContainer.h"
+#include <VizBridge/referencemodeler/ReferenceBrepRenderer.h>
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
+#include <VizBridge/referencemodeler/ReferencePartContainer.h>
 
-#include "contracts/kolba/ConstructionContext.h"
-#include "contracts/kolba/DefaultGeometryItemFactory.h"
-#include "contracts/kolba/Node.h"
-#include "contracts/kolba/PolygonItem.h"
-#include "contracts/kolba/SceneBuilder.h"
-#include "contracts/kolba/SceneContext.h"
-#include "contracts/kolba/SceneLevelContext.h"
-#include "contracts/tarvex/TarvexInputPSReference.h"
-#include "contracts/tarvex/TarvexInputProductStructure.h"
-#include "contracts/tarvex/TarvexModel.h"
-#include "contracts/tarvex/TarvexPartImportResult.h"
 #include "support/TestPartContainer.h"
+#include <VizBridge/contracts/kolba/ConstructionContext.h>
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/Node.h>
+#include <VizBridge/contracts/kolba/PolygonItem.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneContext.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
 
 #include <gtest/gtest.h>
 

@@ -1,9 +1,9 @@
-#include "examples/ReferenceModeler/ReferenceModelerServices.h"
-#include "examples/ReferenceModeler/ReferencePartContainer.h"
+#include <VizBridge/referencemodeler/ReferenceModelerServices.h>
+#include <VizBridge/referencemodeler/ReferencePartContainer.h>
 
-#include "contracts/tarvex/TarvexMultiProcess.h"
 #include "support/BuildStructure.h"
 #include "support/DebugCapture.h"
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
 
 #include <gtest/gtest.h>
 
