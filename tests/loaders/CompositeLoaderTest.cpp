@@ -1,6 +1,6 @@
 #include "LoaderTestSupport.h"
 
-#include "contracts/tarvex/TarvexVisuTestModel.h"
+#include "support/TarvexVisuTestModel.h"
 #include <VizBridge/contracts/kolba/VizMesh.h>
 #include <VizBridge/contracts/kolba/VizPointSet.h>
 #include <VizBridge/contracts/kolba/VizWire.h>

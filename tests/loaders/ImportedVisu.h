@@ -1,6 +1,6 @@
 #pragma once
 
-#include "contracts/tarvex/TarvexVisuTestModel.h"
+#include "support/TarvexVisuTestModel.h"
 #include <VizBridge/contracts/tarvex/TarvexAuthoredVisuPMI.h>
 #include <VizBridge/contracts/tarvex/TarvexFault.h>
 #include <VizBridge/contracts/tarvex/TarvexVisuPMI.h>

@@ -1,4 +1,4 @@
-#include "TarvexVisuTestModel.h"
+#include "support/TarvexVisuTestModel.h"
 
 #include <VizBridge/contracts/tarvex/TarvexPolicy.h>
 #include <VizBridge/contracts/tarvex/TarvexVisu2DTextBuilder.h>

@@ -1,5 +1,5 @@
 #include "TarvexTestText.h"
-#include "TarvexVisuTestModel.h"
+#include "support/TarvexVisuTestModel.h"
 
 #include <VizBridge/contracts/tarvex/TarvexEntityIter.h>
 #include <VizBridge/contracts/tarvex/TarvexVisuAttributes.h>
