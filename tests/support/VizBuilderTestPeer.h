@@ -16,9 +16,6 @@ public:
                                    VizPMIContainer*& pmi) {
         builder.importGraphicalContainer(referenceId, data, viz, pmi);
     }
-    static VizElement* element(VizBuilder const& builder, WString const& visualId) {
-        return builder.GetVizElement(visualId);
-    }
     static VizPartContainer* partContainerOf(VizBuilder& builder,
                                              TarvexInputPSReference const& reference,
                                              TarvexEntity const& entity, WString& path) {

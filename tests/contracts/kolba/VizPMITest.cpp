@@ -1,61 +1,58 @@
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
 #include <VizBridge/contracts/kolba/VizPMI.h>
-#include <VizBridge/contracts/kolba/VizPMIType.h>
-
-#include "CountedElement.h"
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
+#include <VizBridge/contracts/kolba/VizView.h>
 
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <tuple>
 #include <vector>
 
 using namespace KolbaVizCore;
-using CountedElement::newCounted;
+using VizPort::WString;
 
-TEST(VizPMIType, IsTheValueOfItsThreePartsWithItsOwnCopyOfTheName) {
-    char name[] = "VisuNote";
-    VizPMIType const base(VizPMIType::FirstNote, name, Note);
-    name[0] = 'X';
-    EXPECT_EQ(base.GetName(), "VisuNote");
-    EXPECT_EQ(VizPMIType(VizPMIType::GenericPMI, nullptr, PMI).GetName(), "");
-
-    struct Case {
-        VizPMIType other;
-        bool equal;
-    } const cases[] = {
-        {VizPMIType(VizPMIType::FirstNote, "VisuNote", Note), true},
-        {VizPMIType(VizPMIType::LastNote, "VisuNote", Note), false},
-        {VizPMIType(VizPMIType::FirstNote, "VisuNoteGroup", Note), false},
-        {VizPMIType(VizPMIType::FirstNote, "VisuNote", UnknownPMI), false},
+TEST(VizPMICollection, AnElementIsAMemberByItsMechanicalOrVisualIdAndStartsInactive) {
+    VizPMIType const note(VizPMIType::FirstNote, "VisuNote", Note);
+    VizPMI pmi(note, note);
+    pmi.SetMechanicalID(u"M1");
+    pmi.SetVisualID(u"V1");
+    VizEdge edge; // no visual id: only its mechanical id names it
+    edge.SetMechanicalID(u"E");
+    // The member keys, the element, whether it is a member.
+    std::tuple<std::vector<WString>, VizElement const*, bool> const cases[] = {
+        {{u"M1"}, &pmi, true},   {{u"x", u"V1"}, &pmi, true}, {{u"M"}, &pmi, false},
+        {{}, &pmi, false},       {{u""}, &edge, false},       {{u"E"}, &edge, true},
+        {{u"M1"}, &edge, false},
     };
-    for (Case const& c : cases) {
-        EXPECT_EQ(base == c.other, c.equal) << c.other.GetName() << " " << c.other.GetID();
-        EXPECT_EQ(base != c.other, !c.equal);
+    for (auto const& [members, element, member] : cases) {
+        VizView view;
+        for (WString const& key : members)
+            view.AddMember(key);
+        EXPECT_EQ(view.IsMember(*element), member)
+            << element->GetElementType() << " among " << members.size() << " keys";
     }
+    VizCapture capture;
+    EXPECT_FALSE(capture.GetActive());
+    capture.SetActive(true);
+    EXPECT_TRUE(capture.GetActive());
 }
 
-// Run under the sanitizer build as well.
-TEST(VizPMI, KeepsItsGroupAndTypeAndOwnsItsPiecesInTheOrderAdded) {
-    VizPMIType const group(VizPMIType::UndefinedPMI, "VisuUnknown", UnknownPMI);
-    VizPMIType const type(VizPMIType::GenericPMI, "VisuPMI", PMI);
-    int freed = 0;
-    auto pmi = std::make_unique<VizPMI>(group, type);
-    VizEdge* const edges[] = {newCounted<VizEdge>(freed), newCounted<VizEdge>(freed)};
-    VizFace* const face = newCounted<VizFace>(freed);
-    VizText* const text = newCounted<VizText>(freed);
-    pmi->SetEdgeCountHint(2);
-    pmi->SetTextCountHint(1);
-    pmi->AddEdge(edges[0]);
-    pmi->AddEdge(nullptr);
-    pmi->AddEdge(edges[1]);
-    pmi->AddFace(face);
-    pmi->AddText(nullptr);
-    pmi->AddText(text);
-
-    EXPECT_EQ(pmi->GetGroupType(), group);
-    EXPECT_EQ(pmi->GetType(), type);
-    EXPECT_EQ(pmi->GetEdges(), (std::vector<VizEdge*>{edges[0], edges[1]}));
-    EXPECT_EQ(pmi->GetFaces(), std::vector<VizFace*>{face});
-    EXPECT_EQ(pmi->GetTexts(), std::vector<VizText*>{text});
-    pmi.reset();
-    EXPECT_EQ(freed, 4);
+// Run under the sanitizer build as well: a replaced record that leaks, or a record handed
+// back that is freed, fails there.
+TEST(VizPMIContainer, FilesSemanticRecordsByIdAndPrintsPropertiesInKeyOrder) {
+    VizPMIContainer container(1);
+    container.AddSemanticPMI(
+        std::make_unique<SemanticPMI>(SemanticPMI{u"old", u"", u"12", {}, {}}).release());
+    SemanticPMI* const record =
+        std::make_unique<SemanticPMI>(SemanticPMI{u"Datum A", u"A", u"12", {}, {}}).release();
+    record->Properties = {{u"b", u"1"}, {u"B", u"2"}, {u"_0", u"3"}, {u"0_", u"4"}, {u"a", u"5"}};
+    container.AddSemanticPMI(record); // frees the old record
+    container.AddSemanticPMI(record); // and keeps one that is handed back
+    WString text = u"untouched";
+    EXPECT_FALSE(container.GetSemanticPMIAsString(u"Datum A", text)) << "filed by ID only";
+    EXPECT_EQ(text, u"untouched");
+    ASSERT_TRUE(container.GetSemanticPMIAsString(u"12", text));
+    EXPECT_EQ(text, u"Name : Datum A\nLabel : A\nID : 12\n0_ : 4\nB : 2\n_0 : 3\na : 5\nb : 1\n");
 }

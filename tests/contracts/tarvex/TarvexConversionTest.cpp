@@ -1,223 +1,292 @@
+#include "support/TarvexTestProduct.h"
+
 #include <VizBridge/contracts/tarvex/TarvexConvertedPart.h>
 #include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
 #include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
-#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
+#include <VizBridge/contracts/tarvex/TarvexMultiProcessSpooler.h>
 #include <VizBridge/contracts/tarvex/TarvexPartDocument.h>
 
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <chrono>
-#include <cmath>
+#include <functional>
 #include <memory>
+#include <optional>
+#include <set>
+#include <sstream>
 #include <stdexcept>
+#include <string>
 #include <thread>
+#include <tuple>
+#include <utility>
 #include <vector>
 
 namespace {
 
-using ::testing::ElementsAre;
-using ::testing::FloatNear;
-using ::testing::IsEmpty;
-using ::testing::Pointwise;
+using Part = std::shared_ptr<TarvexConvertedPart const>;
 
-/// The document of part `referenceId`, reached as a host reaches it.
-TarvexPartDocument DocumentOf(TarvexModel const& model, unsigned int referenceId) {
-    return model.GetInputProductStructure()
-        .GetReferenceFromId(static_cast<int>(referenceId))
-        .GetDocument();
+/// The document of reference `id`, reached as a host reaches it.
+TarvexPartDocument DocumentOf(TarvexModel const& model, unsigned int id) {
+    return model.GetInputProductStructure().GetReferenceFromId(static_cast<int>(id)).GetDocument();
 }
 
-/// A part 20 placed at the root; its geometry is for the test to fill.
-struct PartModel {
-    TarvexModel model;
-    TarvexAuthoredPartGeometry& geometry;
-
-    PartModel() : geometry(model.AddPart(20, u"Part", u"part.prt").geometry) {
-        model.AddRootInstance(20, u"Part.1");
+/// Per face its triangles' corners and, after the bar, their normals; per edge its points;
+/// then the box.
+std::string Describe(TarvexConvertedPart const& part) {
+    std::ostringstream out;
+    auto const put = [&out](std::vector<float> const& values, char const* end) {
+        for (float const value : values)
+            out << ' ' << value;
+        out << end;
+    };
+    for (TarvexConvertedPart::Face const& face : part.faces) {
+        out << "face " << face.entityId << ':';
+        put(face.positions, " |");
+        put(face.normals, "\n");
     }
-    std::shared_ptr<TarvexConvertedPart const> Convert() const {
-        return DocumentOf(model, 20).GetConvertedPart();
+    for (TarvexConvertedPart::Edge const& edge : part.edges) {
+        out << "edge " << edge.entityId << ':';
+        put(edge.points, "\n");
     }
-};
-
-std::vector<float> Box(TarvexConvertedPart const& part) {
-    return {float(part.low[0]),  float(part.low[1]),  float(part.low[2]),
-            float(part.high[0]), float(part.high[1]), float(part.high[2])};
+    out << "box";
+    if (!part.empty)
+        for (double const bound :
+             {part.low[0], part.low[1], part.low[2], part.high[0], part.high[1], part.high[2]})
+            out << ' ' << bound;
+    return out.str();
 }
 
-TEST(TarvexConversionTest, MakesATriangleSoupWithUnitNormalsPerTriangle) {
-    PartModel part;
-    // A unit square in z = 0 facing up, and a slanted triangle facing (0, -1, 1).
-    part.geometry.faces.push_back({7, {0, 0, 0, 1, 0, 0, 1, 1, 0, 0, 1, 0}, {0, 1, 2, 0, 2, 3}});
-    part.geometry.faces.push_back({8, {0, 0, 0, 2, 0, 0, 0, 1, 1}, {0, 1, 2}});
-    part.geometry.edges.push_back({9, {0, 0, 0, 1, 0, 0}});
-
-    auto const converted = part.Convert();
-    ASSERT_NE(converted, nullptr);
-    ASSERT_EQ(converted->faces.size(), 2u);
-    EXPECT_EQ(converted->faces[0].entityId, 7u);
-    EXPECT_THAT(converted->faces[0].positions,
-                ElementsAre(0, 0, 0, 1, 0, 0, 1, 1, 0, 0, 0, 0, 1, 1, 0, 0, 1, 0));
-    EXPECT_THAT(converted->faces[0].normals, ElementsAre(0, 0, 1, 0, 0, 1));
-    EXPECT_EQ(converted->faces[1].entityId, 8u);
-    EXPECT_THAT(converted->faces[1].positions, ElementsAre(0, 0, 0, 2, 0, 0, 0, 1, 1));
-    float const half = 1.0f / std::sqrt(2.0f);
-    EXPECT_THAT(converted->faces[1].normals,
-                Pointwise(FloatNear(1e-6f), std::vector<float>{0, -half, half}));
-    ASSERT_EQ(converted->edges.size(), 1u);
-    EXPECT_EQ(converted->edges[0].entityId, 9u);
-    EXPECT_THAT(converted->edges[0].points, ElementsAre(0, 0, 0, 1, 0, 0));
-    EXPECT_FALSE(converted->empty);
-    EXPECT_THAT(Box(*converted), ElementsAre(0, 0, 0, 2, 1, 1));
-}
-
-TEST(TarvexConversionTest, SkipsTrianglesWithVerticesThatDoNotExist) {
-    PartModel part;
-    // Three vertices (index 3 is the first that does not exist) and a trailing half triangle.
-    part.geometry.faces.push_back(
-        {1, {0, 0, 0, 1, 0, 0, 0, 1, 0}, {0, 1, 3, 0, 1, 2, 4000000000u, 0, 1, 2, 1, 0, 0, 1}});
-
-    auto const converted = part.Convert();
-    ASSERT_NE(converted, nullptr);
-    ASSERT_EQ(converted->faces.size(), 1u);
-    EXPECT_THAT(converted->faces[0].positions,
-                ElementsAre(0, 0, 0, 1, 0, 0, 0, 1, 0, 0, 1, 0, 1, 0, 0, 0, 0, 0));
-    EXPECT_THAT(converted->faces[0].normals, ElementsAre(0, 0, 1, 0, 0, -1));
-}
-
-TEST(TarvexConversionTest, GivesDegenerateTrianglesAZeroNormal) {
-    PartModel part;
-    part.geometry.faces.push_back({1, {0, 0, 0, 1, 1, 1, 2, 2, 2}, {0, 1, 2, 0, 0, 1}});
-    auto const converted = part.Convert();
-    ASSERT_NE(converted, nullptr);
-    EXPECT_THAT(converted->faces[0].normals, ElementsAre(0, 0, 0, 0, 0, 0));
-}
-
-TEST(TarvexConversionTest, BoxesEveryFaceVertexAndEdgePoint) {
-    PartModel part;
-    // Vertex (-5, 9, 0) is used by no triangle and still counts; so do edge points, and a
-    // face without triangles. The trailing lone coordinate is no point.
-    part.geometry.faces.push_back({1, {0, 0, 0, 1, 0, 0, 0, 1, 0, -5, 9, 0, 100}, {0, 1, 2}});
-    part.geometry.faces.push_back({2, {0, 0, -3}, {}});
-    part.geometry.edges.push_back({3, {4, -1, 2, 0, 0, 6}});
-
-    auto const converted = part.Convert();
-    ASSERT_NE(converted, nullptr);
-    EXPECT_FALSE(converted->empty);
-    EXPECT_THAT(Box(*converted), ElementsAre(-5, -1, -3, 4, 9, 6));
-    ASSERT_EQ(converted->faces.size(), 2u);
-    EXPECT_THAT(converted->faces[1].positions, IsEmpty());
-    EXPECT_THAT(converted->edges[0].points, ElementsAre(4, -1, 2, 0, 0, 6));
-}
-
-TEST(TarvexConversionTest, APartWithoutPointsIsEmpty) {
-    PartModel part;
-    part.geometry.faces.push_back({1, {}, {0, 1, 2}});
-    part.geometry.edges.push_back({2, {1, 2}});
-    auto const converted = part.Convert();
-    ASSERT_NE(converted, nullptr);
-    EXPECT_TRUE(converted->empty);
-    ASSERT_EQ(converted->faces.size(), 1u);
-    EXPECT_THAT(converted->faces[0].positions, IsEmpty());
-    EXPECT_THAT(converted->edges[0].points, ElementsAre(1, 2)) << "a polyline is copied as is";
-
-    PartModel nothing;
-    auto const none = nothing.Convert();
-    ASSERT_NE(none, nullptr);
-    EXPECT_TRUE(none->empty);
-    EXPECT_THAT(none->faces, IsEmpty());
-    EXPECT_THAT(none->edges, IsEmpty());
-}
-
-TEST(TarvexConversionTest, ConvertsOnceAndGivesTheSameObjectThroughEveryHandle) {
-    PartModel part;
-    part.geometry.faces.push_back({1, {0, 0, 0, 1, 0, 0, 0, 1, 0}, {0, 1, 2}});
-    EXPECT_EQ(part.model.GetConversionCount(20), 0);
-    EXPECT_EQ(part.model.GetConversionThread(20), std::nullopt);
-
-    auto const first = part.Convert();
-    TarvexPartDocument const other =
-        part.model.GetInputProductStructure().GetRootInstance(0).GetReference().GetDocument();
-    auto const second = other.GetConvertedPart();
-    ASSERT_NE(first, nullptr);
-    EXPECT_EQ(first, second);
-    EXPECT_EQ(part.model.GetConversionCount(20), 1);
-    EXPECT_EQ(part.model.GetConversionThread(20), std::this_thread::get_id());
-
-    // The result is kept: authoring the geometry afterwards changes nothing.
-    part.geometry.faces.clear();
-    EXPECT_EQ(part.Convert(), first);
-    EXPECT_EQ(part.Convert()->faces.size(), 1u);
-}
-
-TEST(TarvexConversionTest, AFailedConversionIsNullAndNotTriedAgain) {
-    PartModel part;
-    part.geometry.faces.push_back({1, {0, 0, 0, 1, 0, 0, 0, 1, 0}, {0, 1, 2}});
-    part.geometry.conversionFails = true;
-    EXPECT_EQ(part.Convert(), nullptr);
-    part.geometry.conversionFails = false;
-    EXPECT_EQ(part.Convert(), nullptr);
-    EXPECT_EQ(part.model.GetConversionCount(20), 1);
-}
-
-TEST(TarvexConversionTest, OnlyPartsOfTheModelConvert) {
-    PartModel part;
-    part.model.AddAssembly(10, u"Assembly");
-    EXPECT_EQ(DocumentOf(part.model, 10).GetConvertedPart(), nullptr) << "a sub-assembly";
-    EXPECT_EQ(TarvexPartDocument(nullptr, 20).GetConvertedPart(), nullptr);
-    EXPECT_EQ(TarvexPartDocument().GetConvertedPart(), nullptr);
-    EXPECT_EQ(part.model.GetConversionCount(10), 0);
-    EXPECT_EQ(part.model.GetConversionCount(20), 0);
-    EXPECT_EQ(TarvexModel().GetConversionCount(20), 0);
-}
-
-TEST(TarvexConversionTest, SpendsTheConversionCost) {
-    PartModel part;
-    part.geometry.conversionCostMicroseconds = 20000;
-    auto const start = std::chrono::steady_clock::now();
-    ASSERT_NE(part.Convert(), nullptr);
-    EXPECT_GE(std::chrono::steady_clock::now() - start, std::chrono::microseconds(20000));
-
-    // A failing conversion costs its time too; a converted part costs nothing the second time.
-    part.geometry.conversionFails = true;
-    part.model.AddPart(30, u"Failing").geometry = part.geometry;
-    auto const failingStart = std::chrono::steady_clock::now();
-    EXPECT_EQ(DocumentOf(part.model, 30).GetConvertedPart(), nullptr);
-    EXPECT_GE(std::chrono::steady_clock::now() - failingStart, std::chrono::microseconds(20000));
-}
-
-TEST(TarvexConversionTest, ConcurrentCallersShareOneConversion) {
-    PartModel part;
-    part.geometry.faces.push_back({1, {0, 0, 0, 1, 0, 0, 0, 1, 0}, {0, 1, 2}});
-    // Long enough for the callers to overlap; the outcome does not depend on whether they do.
-    part.geometry.conversionCostMicroseconds = 50000;
-    TarvexPartDocument const document = DocumentOf(part.model, 20);
-
-    std::vector<std::shared_ptr<TarvexConvertedPart const>> results(4);
-    std::vector<std::thread> callers;
-    for (auto& result : results) {
-        callers.emplace_back([&document, &result] { result = document.GetConvertedPart(); });
+TEST(TarvexConversionTest, MakesATriangleSoupWithAUnitNormalPerTriangleAndABox) {
+    std::pair<TarvexAuthoredPartGeometry, char const*> const cases[] = {
+        // A square facing up, a slanted triangle and an edge.
+        {{{{7, {0, 0, 0, 1, 0, 0, 1, 1, 0, 0, 1, 0}, {0, 1, 2, 0, 2, 3}},
+           {8, {0, 0, 0, 2, 0, 0, 0, 1, 1}, {0, 1, 2}}},
+          {{9, {0, 0, 0, 1, 0, 0}}}},
+         "face 7: 0 0 0 1 0 0 1 1 0 0 0 0 1 1 0 0 1 0 | 0 0 1 0 0 1\n"
+         "face 8: 0 0 0 2 0 0 0 1 1 | 0 -0.707107 0.707107\n"
+         "edge 9: 0 0 0 1 0 0\nbox 0 0 0 2 1 1"},
+        // Triangles naming no vertex and half a triangle are dropped; no area, no normal.
+        {{{{1,
+            {0, 0, 0, 1, 0, 0, 0, 1, 0},
+            {0, 1, 3, 0, 1, 2, 4000000000u, 0, 1, 2, 1, 0, 0, 0, 1, 0, 1}}},
+          {}},
+         "face 1: 0 0 0 1 0 0 0 1 0 0 1 0 1 0 0 0 0 0 0 0 0 0 0 0 1 0 0 | 0 0 1 0 0 -1 0 0 0\n"
+         "box 0 0 0 1 1 0"},
+        // The box holds every vertex and edge point, but no lone coordinate.
+        {{{{1, {0, 0, 0, 1, 0, 0, 0, 1, 0, -5, 9, 0, 100}, {0, 1, 2}}, {2, {0, 0, -3}, {}}},
+          {{3, {4, -1, 2, 0, 0, 6}}}},
+         "face 1: 0 0 0 1 0 0 0 1 0 | 0 0 1\nface 2: |\nedge 3: 4 -1 2 0 0 6\nbox -5 -1 -3 4 9 6"},
+        // No point at all, and nothing.
+        {{{{1, {}, {0, 1, 2}}}, {{2, {1, 2}}}}, "face 1: |\nedge 2: 1 2\nbox"},
+        {{}, "box"},
+    };
+    for (auto const& [geometry, expected] : cases) {
+        TarvexModel model;
+        model.AddPart(20, u"Part").geometry = geometry;
+        Part const converted = DocumentOf(model, 20).GetConvertedPart();
+        ASSERT_NE(converted, nullptr) << expected;
+        EXPECT_EQ(Describe(*converted), expected);
     }
-    for (std::thread& caller : callers) {
-        caller.join();
-    }
-    ASSERT_NE(results[0], nullptr);
-    EXPECT_THAT(results, ::testing::Each(results[0]));
-    EXPECT_EQ(part.model.GetConversionCount(20), 1);
 }
 
-TEST(TarvexConversionTest, APlannedFaultThrowsBeforeConverting) {
-    PartModel part;
-    TarvexFault fault;
-    fault.operation = "TarvexPartDocument::GetConvertedPart";
+TEST(TarvexConversionTest, ConvertsEachPartOnceAfterAnyPlannedFaultAndKeepsResultsAndFailures) {
+    TarvexModel model = MakeTestProduct();
+    TarvexFault fault = FaultOn("TarvexPartDocument::GetConvertedPart");
     fault.times = 1;
-    part.model.Faults().Add(fault);
-    TarvexPartDocument const document = DocumentOf(part.model, 20);
-    EXPECT_THROW(document.GetConvertedPart(), std::runtime_error);
-    EXPECT_EQ(part.model.GetConversionCount(20), 0);
-    EXPECT_NE(document.GetConvertedPart(), nullptr);
-    EXPECT_EQ(part.model.GetConversionCount(20), 1);
+    model.Faults().Add(fault);
+    EXPECT_EQ(Outcome([&] { DocumentOf(model, 10).GetConvertedPart(); }), fault.operation);
+    EXPECT_EQ(model.GetConversionCount(10), 0);
+    Part const first = DocumentOf(model, 10).GetConvertedPart();
+    ASSERT_NE(first, nullptr);
+    model.FindReference(10)->geometry.faces.clear();
+    EXPECT_EQ(DocumentOf(model, 10).GetConvertedPart(), first) << "kept: later authoring is unseen";
+    EXPECT_EQ(model.GetConversionCount(10), 1);
+    EXPECT_EQ(model.GetConversionThread(10), std::this_thread::get_id());
+
+    model.FindReference(30)->geometry.conversionFails = true;
+    EXPECT_EQ(DocumentOf(model, 30).GetConvertedPart(), nullptr);
+    model.FindReference(30)->geometry.conversionFails = false;
+    EXPECT_EQ(DocumentOf(model, 30).GetConvertedPart(), nullptr) << "a failure is kept too";
+    EXPECT_EQ(model.GetConversionCount(30), 1);
+
+    // Only parts of a model convert.
+    EXPECT_EQ(DocumentOf(model, 1).GetConvertedPart(), nullptr);
+    EXPECT_EQ(TarvexPartDocument(nullptr, 20).GetConvertedPart(), nullptr);
+}
+
+/// Polls the spooler as a host does until it completes, and gives the ids it delivered, a
+/// failed conversion marked with "!", in order up to `anyOrderFrom` and sorted after it. A
+/// spooler that does not complete within a minute fails the test instead of hanging it.
+std::string Drain(TarvexMultiProcessSpooler& spooler, std::size_t anyOrderFrom = 0) {
+    std::vector<std::string> ids;
+    auto const deadline = std::chrono::steady_clock::now() + std::chrono::minutes(1);
+    unsigned int id = 0;
+    while (!spooler.IsComplete() && std::chrono::steady_clock::now() < deadline) {
+        if (spooler.HasDataAvailableFor(id)) {
+            bool const failed = spooler.GetActiveRepresentation() == TarvexRep_None;
+            ids.push_back(std::to_string(id) + (failed ? "!" : ""));
+        } else {
+            std::this_thread::sleep_for(std::chrono::milliseconds(1));
+        }
+    }
+    EXPECT_TRUE(spooler.IsComplete());
+    EXPECT_FALSE(spooler.HasDataAvailableFor(id)) << "nothing after completion";
+    std::sort(ids.begin() + std::min(anyOrderFrom, ids.size()), ids.end());
+    std::string text;
+    for (std::string const& delivered : ids) {
+        text += (text.empty() ? "" : " ") + delivered;
+    }
+    return text;
+}
+
+// Each unique part is delivered once, when it is converted and its turn has come, converted
+// on no more worker threads than allowed: 0 to use stands for every physical processor, and
+// there are never more workers than the 4 parts.
+TEST(TarvexSpoolerTest, ConvertsOnWorkerThreadsAndDeliversEachPartOnceInTurn) {
+    using Model = TarvexModel&;
+    auto const part = [](Model m, unsigned int id) -> auto& {
+        return m.FindReference(id)->geometry;
+    };
+    // To use, physical processors, workers at most, deliveries, from where they may come in
+    // any order, and how the model is prepared.
+    std::tuple<int, std::optional<int>, std::size_t, std::string, std::size_t,
+               std::function<void(Model)>> const cases[] = {
+        // One worker follows a depth-first walk, but what finished first comes first.
+        {1, 8, 1, "10 20 30 40", 4, [](Model) {}},
+        {0, 1, 1, "40 10 20 30", 4, [](Model m) { DocumentOf(m, 40).GetConvertedPart(); }},
+        // The model's order first, without unknown ids, repeats or sub-assemblies: 40 is slow,
+        // and 30 waits for it although it finishes earlier.
+        {0, 3, 3, "40 30 10 20", 2,
+         [&](Model m) {
+             part(m, 40).conversionCostMicroseconds = 30000;
+             m.SetSpoolerDeliveryOrder({40, 777, 30, 40, 2, 99});
+         }},
+        // An alias in place of its reference; a failed conversion as no representation.
+        {3, 1, 3, "10 2020 30 40", 0, [](Model m) { m.SetSpoolerIdAlias(20, 2020); }},
+        {16, {}, 4, "10 20 30! 40", 0, [&](Model m) { part(m, 30).conversionFails = true; }},
+        {0, 64, 4, "10 20 30 40", 0, [](Model) {}},
+    };
+    for (auto const& [toUse, physical, atMost, expected, anyOrderFrom, prepare] : cases) {
+        SCOPED_TRACE(expected);
+        TarvexScopedProcessors const processors(toUse, physical);
+        TarvexModel model = MakeTestProduct(5000); // long enough for every worker to get a part
+        prepare(model);
+        TarvexMultiProcessSpooler spooler(model.GetInputProductStructure());
+        ASSERT_TRUE(spooler.InitiateConversion(TarvexRep_BREP));
+        EXPECT_EQ(Drain(spooler, anyOrderFrom), expected);
+        std::set<std::optional<std::thread::id>> workers;
+        for (unsigned int const id : {10u, 20u, 30u, 40u}) {
+            workers.insert(model.GetConversionThread(id));
+            // The host's own request is answered from what was converted.
+            DocumentOf(model, id).GetConvertedPart();
+            EXPECT_EQ(model.GetConversionCount(id), 1) << id;
+        }
+        workers.erase(std::this_thread::get_id()); // where the host converted first
+        EXPECT_LE(workers.size(), atMost);
+        EXPECT_EQ(workers.count(std::nullopt), 0u);
+    }
+    TarvexModel aliased = MakeTestProduct();
+    aliased.SetSpoolerIdAlias(20, 2020);
+    EXPECT_EQ(aliased.GetInputProductStructure().GetReferenceFromId(2020).GetUniqueID(), 20u);
+}
+
+TEST(TarvexSpoolerTest, StartsOnceForTheModelerReadyFormAndCompletesWhenAllIsHandedOver) {
+    TarvexModel nothing;
+    nothing.AddAssembly(1, u"Empty");
+    nothing.AddPart(10, u"Unplaced");
+    nothing.AddRootInstance(1, u"Empty.1");
+    nothing.AddRootInstance(99, u"undefined");
+    for (TarvexInputProductStructure const& input :
+         {nothing.GetInputProductStructure(), TarvexInputProductStructure()}) {
+        TarvexMultiProcessSpooler spooler(input);
+        EXPECT_TRUE(spooler.InitiateConversion(TarvexRep_BREP));
+        EXPECT_TRUE(spooler.IsComplete()) << "nothing to convert";
+        unsigned int id = 5;
+        EXPECT_FALSE(spooler.HasDataAvailableFor(id));
+        EXPECT_EQ(id, 5u);
+        EXPECT_EQ(spooler.GetActiveRepresentation(), TarvexRep_None);
+    }
+    EXPECT_EQ(nothing.GetConversionCount(10), 0);
+
+    TarvexScopedProcessors const processors(2, std::nullopt);
+    TarvexModel const model = MakeTestProduct(20000);
+    TarvexMultiProcessSpooler spooler(model.GetInputProductStructure());
+    EXPECT_FALSE(spooler.InitiateConversion(TarvexRep_Visualization));
+    EXPECT_FALSE(spooler.InitiateConversion(TarvexRep_None));
+    EXPECT_TRUE(spooler.IsComplete()) << "nothing was started";
+    EXPECT_TRUE(spooler.InitiateConversion(TarvexRep_BREP));
+    EXPECT_FALSE(spooler.InitiateConversion(TarvexRep_BREP)) << "while it runs";
+    // The host asks for every part while the workers convert them: each is converted once.
+    for (unsigned int const id : {10u, 20u, 30u, 40u}) {
+        EXPECT_NE(DocumentOf(model, id).GetConvertedPart(), nullptr);
+    }
+    EXPECT_FALSE(spooler.IsComplete()) << "converted is not handed over";
+    EXPECT_EQ(Drain(spooler), "10 20 30 40");
+    for (unsigned int const id : {10u, 20u, 30u, 40u}) {
+        EXPECT_EQ(model.GetConversionCount(id), 1) << id;
+    }
+    EXPECT_FALSE(spooler.InitiateConversion(TarvexRep_BREP)) << "after it finished";
+}
+
+TEST(TarvexSpoolerTest, StopsItsWorkersWhenDestroyedMidConversion) {
+    TarvexScopedProcessors const processors(1, std::nullopt);
+    TarvexModel model = MakeTestProduct();
+    model.FindReference(10)->geometry.conversionCostMicroseconds = 200000;
+    {
+        TarvexMultiProcessSpooler spooler(model.GetInputProductStructure());
+        ASSERT_TRUE(spooler.InitiateConversion(TarvexRep_BREP));
+        auto const deadline = std::chrono::steady_clock::now() + std::chrono::minutes(1);
+        while (model.GetConversionCount(10) == 0 && std::chrono::steady_clock::now() < deadline) {
+            std::this_thread::sleep_for(std::chrono::milliseconds(1));
+        }
+    }
+    // The conversion under way finished and is kept; no other part was started.
+    EXPECT_EQ(model.GetConversionCount(10), 1);
+    EXPECT_NE(DocumentOf(model, 10).GetConvertedPart(), nullptr);
+    EXPECT_EQ(model.GetConversionCount(20) + model.GetConversionCount(30), 0);
+}
+
+TEST(TarvexSpoolerTest, LosesNoPartToAFaultedStartOrPollNorToTheModelGoingAway) {
+    TarvexScopedProcessors const processors(2, std::nullopt);
+    auto model = std::make_unique<TarvexModel>(MakeTestProduct());
+    model->FindReference(10)->geometry.conversionCostMicroseconds = 10000;
+    for (char const* operation : {"TarvexMultiProcessSpooler::InitiateConversion",
+                                  "TarvexMultiProcessSpooler::HasDataAvailableFor"}) {
+        TarvexFault fault = FaultOn(operation);
+        fault.times = 1;
+        model->Faults().Add(fault);
+    }
+    TarvexMultiProcessSpooler spooler(model->GetInputProductStructure());
+    EXPECT_THROW(spooler.InitiateConversion(TarvexRep_BREP), std::runtime_error);
+    EXPECT_TRUE(spooler.IsComplete()) << "a faulted start starts nothing";
+    ASSERT_TRUE(spooler.InitiateConversion(TarvexRep_BREP));
+    model.reset();
+    unsigned int id = 0;
+    EXPECT_THROW(spooler.HasDataAvailableFor(id), std::runtime_error);
+    EXPECT_EQ(Drain(spooler), "10 20 30 40");
+}
+
+TEST(TarvexMultiProcessTest, UsesEveryProcessorByDefaultAndScopedGuardsRestoreTheSettings) {
+    auto const settings = [] {
+        return std::to_string(TarvexMultiProcess::GetNumberOfProcessorsToUse()) + " of " +
+               std::to_string(TarvexMultiProcess::GetNumberOfPhysicalProcessors());
+    };
+    std::string const initial =
+        "0 of " + std::to_string(std::max(int(std::thread::hardware_concurrency()), 1));
+    EXPECT_EQ(settings(), initial);
+    {
+        TarvexScopedProcessors const outer(4, 8);
+        {
+            TarvexScopedProcessors const inner(1, std::nullopt);
+            TarvexMultiProcess::SetNumberOfProcessorsToUse(-3);
+            TarvexMultiProcess::SetPhysicalProcessorsOverride(-5);
+            EXPECT_EQ(settings(), "0 of 1") << "out of range: the nearest meaningful count";
+        }
+        EXPECT_EQ(settings(), "4 of 8");
+    }
+    EXPECT_EQ(settings(), initial);
 }
 
 } // namespace

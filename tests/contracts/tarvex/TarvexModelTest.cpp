@@ -1,383 +1,192 @@
-#include "TarvexTestText.h"
+#include "support/TarvexTestProduct.h"
 
-#include <VizBridge/contracts/tarvex/TarvexDocument.h>
 #include <VizBridge/contracts/tarvex/TarvexInputPSReference.h>
 #include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
-#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexInstanceEntity.h>
+#include <VizBridge/contracts/tarvex/TarvexLengthUnitUtils.h>
 #include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuEntity.h>
 
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <optional>
-#include <ostream>
 #include <stdexcept>
+#include <string>
+#include <tuple>
 #include <utility>
+#include <vector>
 
 namespace {
 
-/// An assembly "Housing" (10) at the root, holding two instances of the part "Shaft" (20).
-/// Every optional value is present.
-TarvexModel MakeFullModel() {
-    TarvexModel model;
-    model.SetProductName(u"Gearbox");
-    model.SetUnits(TarvexLengthUnit_Millimeter);
-    model.AddAssembly(10, u"Housing", u"housing.asm");
-    model.AddPart(20, u"Shaft", u"shaft.prt");
+/// The text as a reader sees it; "(none)" when there is none.
+std::string Text(TarvexWString const& text) {
+    std::optional<std::u16string> const value = TextOf(text);
+    return value ? VizPort::Narrow(*value) : "(none)";
+}
 
-    TarvexAuthoredInstance& root = model.AddRootInstance(10, u"Housing.1");
-    TarvexPlacement placement;
-    double const rotation[3][3] = {{0, -1, 0}, {1, 0, 0}, {0, 0, 1}};
-    for (int row = 0; row < 3; ++row) {
-        for (int column = 0; column < 3; ++column) {
-            placement.rotation[row][column] = rotation[row][column];
-        }
-        placement.translation[row] = 5.0 + row;
+/// An instance and what it places on one line, and the instances below it indented.
+void Describe(TarvexInputPSInstance const& instance, std::string const& indent, std::string& out) {
+    TarvexInputPSReference const reference = instance.GetReference();
+    out += indent + Text(instance.GetInstanceName()) + " -> " +
+           std::to_string(reference.GetUniqueID()) + " " + Text(reference.GetReferenceName()) +
+           " " + Text(reference.GetStorageName()) + (reference.IsPart() ? " part\n" : "\n");
+    for (int index = 0; index < reference.GetInstancesCount(); ++index) {
+        Describe(reference.GetInstance(index), indent + "  ", out);
     }
-    root.placement = placement;
-    root.rgb = {{10, 20, 300}};
-    root.alpha = 128;
-    root.hidden = true;
-    root.suppressed = false;
-
-    model.AddInstance(10, 20, u"Shaft.1");
-    model.AddInstance(10, 20, u"Shaft.2").hidden = false;
-
-    TarvexAuthoredDocument& document = model.Document();
-    document.fileName = u"gearbox.asm";
-    document.author = u"A. Author";
-    document.organization = u"Works";
-    document.sourceSystem = u"CAD 9";
-    document.version = u"3";
-    document.unit = u"mm";
-    document.comment = u"";
-    document.formatType = u"native";
-
-    model.AddMissingFile(u"bolt.prt");
-    model.AddMissingFile(u"nut.prt");
-    return model;
 }
 
-TEST(TarvexModelTest, ReadsBackEverythingAuthored) {
-    TarvexModel const model = MakeFullModel();
-    TarvexInputProductStructure const structure = model.GetInputProductStructure();
-
-    EXPECT_EQ(TextOf(structure.GetProductName()), u"Gearbox");
-    EXPECT_EQ(structure.GetUnits(), TarvexLengthUnit_Millimeter);
-    EXPECT_EQ(structure.GetUniqueReferencesCount(), 2);
-    ASSERT_EQ(structure.GetRootInstancesCount(), 1);
-
-    TarvexInputPSInstance const root = structure.GetRootInstance(0);
-    EXPECT_EQ(TextOf(root.GetInstanceName()), u"Housing.1");
-    double rotation[3][3] = {};
-    double translation[3] = {};
-    EXPECT_TRUE(root.GetInstancePositionMatrix(rotation, translation));
-    EXPECT_EQ(rotation[0][1], -1.0);
-    EXPECT_EQ(rotation[1][0], 1.0);
-    EXPECT_EQ(rotation[0][0], 0.0);
-    EXPECT_EQ(rotation[2][2], 1.0);
-    EXPECT_EQ(translation[0], 5.0);
-    EXPECT_EQ(translation[2], 7.0);
-    unsigned short red = 0, green = 0, blue = 0, alpha = 0;
-    EXPECT_TRUE(root.GetRGBColor(red, green, blue));
-    EXPECT_EQ(red, 10);
-    EXPECT_EQ(green, 20);
-    EXPECT_EQ(blue, 300);
-    EXPECT_TRUE(root.GetAlphaColor(alpha));
-    EXPECT_EQ(alpha, 128);
-    bool hidden = false, suppressed = true;
-    EXPECT_TRUE(root.GetHidden(hidden));
-    EXPECT_TRUE(hidden);
-    EXPECT_TRUE(root.GetSuppressed(suppressed));
-    EXPECT_FALSE(suppressed);
-
-    TarvexInputPSReference const housing = root.GetReference();
-    EXPECT_EQ(housing.GetUniqueID(), 10u);
-    EXPECT_FALSE(housing.IsPart());
-    EXPECT_EQ(TextOf(housing.GetReferenceName()), u"Housing");
-    EXPECT_EQ(TextOf(housing.GetStorageName()), u"housing.asm");
-    ASSERT_EQ(housing.GetInstancesCount(), 2);
-    EXPECT_EQ(TextOf(housing.GetInstance(0).GetInstanceName()), u"Shaft.1");
-    EXPECT_EQ(TextOf(housing.GetInstance(1).GetInstanceName()), u"Shaft.2");
-
-    TarvexInputPSReference const shaft = housing.GetInstance(1).GetReference();
-    EXPECT_EQ(shaft.GetUniqueID(), 20u);
-    EXPECT_TRUE(shaft.IsPart());
-    EXPECT_EQ(shaft.GetInstancesCount(), 0);
-    EXPECT_EQ(TextOf(shaft.GetStorageName()), u"shaft.prt");
-    TarvexPartDocument const part = shaft.GetDocument();
-    EXPECT_TRUE(part.IsValid());
-    EXPECT_EQ(part.GetReferenceId(), 20u);
-    EXPECT_EQ(TextOf(part.GetName()), u"Shaft");
-
-    TarvexDocument document = model.GetDocument();
-    TarvexDocumentInformation const information = document.GetInformation();
-    TarvexWString text;
-    EXPECT_TRUE(information.GetFileName(text));
-    EXPECT_EQ(TextOf(text), u"gearbox.asm");
-    EXPECT_TRUE(information.GetAuthor(text));
-    EXPECT_EQ(TextOf(text), u"A. Author");
-    EXPECT_TRUE(information.GetOrganization(text));
-    EXPECT_EQ(TextOf(text), u"Works");
-    EXPECT_TRUE(information.GetSourceSystem(text));
-    EXPECT_EQ(TextOf(text), u"CAD 9");
-    EXPECT_TRUE(information.GetVersion(text));
-    EXPECT_EQ(TextOf(text), u"3");
-    EXPECT_TRUE(information.GetUnit(text));
-    EXPECT_EQ(TextOf(text), u"mm");
-    EXPECT_TRUE(information.GetComment(text));
-    EXPECT_EQ(TextOf(text), u""); // present, though empty
-    EXPECT_TRUE(information.GetFormatType(text));
-    EXPECT_EQ(TextOf(text), u"native");
-
-    TarvexInputPSMissingFileIter missing = model.GetImportResult().GetMissingFileIterator();
-    EXPECT_EQ(missing.GetCount(), 2);
-    ASSERT_TRUE(missing.Next());
-    EXPECT_EQ(TextOf(missing.Current()), u"bolt.prt");
-    ASSERT_TRUE(missing.Next());
-    EXPECT_EQ(TextOf(missing.Current()), u"nut.prt");
-    EXPECT_FALSE(missing.Next());
-}
-
-TEST(TarvexModelTest, ReadsBackEverythingAbsent) {
-    TarvexModel model;
-    model.AddAssembly(1, std::nullopt);
-    model.AddRootInstance(1, std::nullopt);
-    model.AddInstance(1, 1, std::nullopt);
-    model.AddMissingFile(std::nullopt);
-
-    TarvexInputProductStructure const structure = model.GetInputProductStructure();
-    EXPECT_EQ(TextOf(structure.GetProductName()), std::nullopt);
-    EXPECT_EQ(structure.GetUnits(), TarvexLengthUnit_Unknown);
-
-    TarvexInputPSInstance const root = structure.GetRootInstance(0);
-    EXPECT_EQ(TextOf(root.GetInstanceName()), std::nullopt);
-    double rotation[3][3] = {{9, 9, 9}, {9, 9, 9}, {9, 9, 9}};
-    double translation[3] = {9, 9, 9};
-    EXPECT_FALSE(root.GetInstancePositionMatrix(rotation, translation));
-    for (int row = 0; row < 3; ++row) {
-        for (int column = 0; column < 3; ++column) {
-            EXPECT_EQ(rotation[row][column], row == column ? 1.0 : 0.0);
-        }
-        EXPECT_EQ(translation[row], 0.0);
+/// The product as its reader sees it: name, unit and reference count, then the instances.
+std::string Describe(TarvexInputProductStructure const& structure) {
+    std::string out = Text(structure.GetProductName()) + ", unit " +
+                      std::to_string(structure.GetUnits()) + ", " +
+                      std::to_string(structure.GetUniqueReferencesCount()) + " references\n";
+    for (int index = 0; index < structure.GetRootInstancesCount(); ++index) {
+        Describe(structure.GetRootInstance(index), "", out);
     }
-
-    TarvexInputPSReference const reference = root.GetReference();
-    EXPECT_EQ(reference.GetUniqueID(), 1u);
-    EXPECT_EQ(TextOf(reference.GetReferenceName()), std::nullopt);
-    EXPECT_EQ(TextOf(reference.GetStorageName()), std::nullopt);
-    EXPECT_EQ(TextOf(reference.GetDocument().GetName()), std::nullopt);
-
-    TarvexInputPSMissingFileIter missing = model.GetImportResult().GetMissingFileIterator();
-    EXPECT_EQ(missing.GetCount(), 1);
-    ASSERT_TRUE(missing.Next());
-    EXPECT_EQ(TextOf(missing.Current()), std::nullopt);
-    EXPECT_FALSE(missing.Next());
+    return out;
 }
 
-TEST(TarvexModelTest, GivesInstanceIdsInOrderFromOne) {
-    TarvexModel model;
-    model.AddAssembly(7, u"A");
-    EXPECT_EQ(model.AddRootInstance(7, u"r").instanceId, 1u);
-    EXPECT_EQ(model.AddInstance(7, 8, u"c1").instanceId, 2u);
-    EXPECT_EQ(model.AddRootInstance(8, u"r2").instanceId, 3u);
-    EXPECT_EQ(model.AddInstance(7, 8, u"c2").instanceId, 4u);
-    EXPECT_EQ(model.FindReference(7)->instances, (std::vector<unsigned int>{2, 4}));
+// The shared part counts once; the reference that was placed but never added is empty and
+// not counted.
+std::string const kProduct = R"(Gearbox, unit 4, 6 references
+Top.1 -> 1 Top top.asm
+  10.1 -> 10 P10 10.prt part
+  20.1 -> 20 P20 20.prt part
+  Sub.1 -> 2 Sub (none)
+    30.1 -> 30 P30 30.prt part
+    20.2 -> 20 P20 20.prt part
+  20.3 -> 20 P20 20.prt part
+  undefined -> 0 (none) (none)
+40.1 -> 40 P40 40.prt part
+)";
 
-    TarvexInputProductStructure const structure = model.GetInputProductStructure();
-    ASSERT_EQ(structure.GetRootInstancesCount(), 2);
-    EXPECT_EQ(TextOf(structure.GetRootInstance(0).GetInstanceName()), u"r");
-    EXPECT_EQ(TextOf(structure.GetRootInstance(1).GetInstanceName()), u"r2");
-}
+std::string const kEmpty = "(none), unit 0, 0 references\n";
 
-TEST(TarvexModelTest, RecordsStayValidWhileTheModelGrows) {
-    TarvexModel model;
-    TarvexAuthoredReference& first = model.AddAssembly(1, u"first");
-    TarvexAuthoredInstance& firstInstance = model.AddRootInstance(1, u"i1");
-    for (unsigned int id = 2; id < 500; ++id) {
+TEST(TarvexModelTest, GivesInstanceIdsInOrderAndKeepsTheFirstRecordOfAReferenceValid) {
+    TarvexModel model = MakeTestProduct();
+    EXPECT_EQ(Describe(model.GetInputProductStructure()), kProduct);
+    EXPECT_EQ(model.FindReference(1)->instances, (std::vector<unsigned int>{2, 3, 4, 7, 8}));
+    EXPECT_THROW(model.AddInstance(99, 10, u"lost"), std::invalid_argument);
+    TarvexAuthoredInstance& next = model.AddInstance(2, 10, u"next");
+    EXPECT_EQ(next.instanceId, 10u) << "the failed call took no id";
+    TarvexAuthoredReference& again = model.AddAssembly(10, u"other", u"other.asm");
+    EXPECT_EQ(&again, model.FindReference(10));
+    EXPECT_TRUE(again.isPart && again.name == u"P10" && again.storageName == u"10.prt");
+    // Records stay valid while the model grows.
+    for (unsigned int id = 100; id < 600; ++id) {
         model.AddPart(id, u"p");
-        model.AddInstance(1, id, u"i");
+        model.AddInstance(2, id, u"i");
     }
-    first.name = u"renamed";
-    firstInstance.name = u"renamed instance";
-    TarvexInputPSInstance const root = model.GetInputProductStructure().GetRootInstance(0);
-    EXPECT_EQ(TextOf(root.GetInstanceName()), u"renamed instance");
-    EXPECT_EQ(TextOf(root.GetReference().GetReferenceName()), u"renamed");
-    EXPECT_EQ(root.GetReference().GetInstancesCount(), 498);
+    again.name = u"renamed";
+    next.name = u"renamed instance";
+    TarvexInputPSReference const sub = model.GetInputProductStructure().GetReferenceFromId(2);
+    EXPECT_EQ(sub.GetInstancesCount(), 503);
+    EXPECT_EQ(Text(sub.GetInstance(2).GetInstanceName()), "renamed instance");
+    EXPECT_EQ(Text(sub.GetInstance(2).GetReference().GetReferenceName()), "renamed");
 }
 
-TEST(TarvexModelTest, AddInstanceBelowAnUnknownParentThrowsAndAddsNothing) {
+TEST(TarvexModelTest, CountsTheUniqueReferencesReachableFromTheRootUnlessOverridden) {
     TarvexModel model;
+    auto const count = [&model] {
+        return model.GetInputProductStructure().GetUniqueReferencesCount();
+    };
     model.AddAssembly(1, u"A");
-    EXPECT_THROW(model.AddInstance(2, 1, u"lost"), std::invalid_argument);
-    EXPECT_EQ(model.AddInstance(1, 1, u"kept").instanceId, 1u);
-    EXPECT_EQ(model.FindReference(1)->instances.size(), 1u);
-}
-
-TEST(TarvexModelTest, AddingAKnownReferenceAgainKeepsTheFirstRecord) {
-    TarvexModel model;
-    TarvexAuthoredReference& part = model.AddPart(5, u"first", u"first.prt");
-    TarvexAuthoredReference& again = model.AddAssembly(5, u"second", u"second.asm");
-    EXPECT_EQ(&part, &again);
-    EXPECT_TRUE(again.isPart);
-    EXPECT_EQ(again.name, u"first");
-    EXPECT_EQ(again.storageName, u"first.prt");
-    EXPECT_EQ(model.FindReference(6), nullptr);
-}
-
-TEST(TarvexModelTest, AnInstanceOfAnUnknownReferenceGivesAnEmptyReference) {
-    TarvexModel model;
-    model.AddRootInstance(99, u"dangling");
-    TarvexInputPSReference const reference =
-        model.GetInputProductStructure().GetRootInstance(0).GetReference();
-    EXPECT_EQ(reference.GetUniqueID(), 0u);
-    EXPECT_FALSE(reference.IsPart());
-    EXPECT_EQ(reference.GetInstancesCount(), 0);
-    EXPECT_EQ(TextOf(reference.GetReferenceName()), std::nullopt);
-    EXPECT_FALSE(reference.GetDocument().IsValid());
-}
-
-TEST(TarvexModelTest, IndexesOutOfRangeGiveEmptyInstances) {
-    TarvexModel const model = MakeFullModel();
-    TarvexInputProductStructure const structure = model.GetInputProductStructure();
-    TarvexInputPSReference const housing = structure.GetRootInstance(0).GetReference();
-    for (TarvexInputPSInstance const& instance :
-         {structure.GetRootInstance(-1), structure.GetRootInstance(1), housing.GetInstance(-1),
-          housing.GetInstance(2)}) {
-        EXPECT_EQ(TextOf(instance.GetInstanceName()), std::nullopt);
-        EXPECT_EQ(instance.GetReference().GetUniqueID(), 0u);
+    model.AddPart(2, u"unplaced");
+    EXPECT_EQ(count(), 0);
+    model.AddRootInstance(1, u"a");
+    model.AddInstance(1, 1, u"inside itself");
+    EXPECT_EQ(count(), 1);
+    for (int const overridden : {7, 0}) {
+        model.SetUniqueReferencesCount(overridden);
+        EXPECT_EQ(count(), overridden);
     }
+    model.SetUniqueReferencesCount(std::nullopt);
+    EXPECT_EQ(count(), 1);
 }
 
-struct UniqueCountCase {
-    char const* name;
-    void (*author)(TarvexModel&);
-    int expected;
-};
-
-void PrintTo(UniqueCountCase const& c, std::ostream* os) {
-    *os << c.name;
+TEST(TarvexModelTest, ValueObjectsShareTheDataWhichMovesWithTheModelAndOutlivesIt) {
+    auto source = std::make_unique<TarvexModel>(MakeTestProduct());
+    TarvexInputProductStructure const before = source->GetInputProductStructure();
+    TarvexModel target = std::move(*source);
+    EXPECT_EQ(Describe(target.GetInputProductStructure()), kProduct);
+    EXPECT_EQ(Describe(source->GetInputProductStructure()), kEmpty);
+    EXPECT_EQ(Describe(TarvexInputProductStructure()), kEmpty);
+    // A moved-from model starts afresh; handles see authoring done after they were handed out.
+    source->AddPart(5, u"P5");
+    TarvexInputProductStructure const later = source->GetInputProductStructure();
+    EXPECT_EQ(source->AddRootInstance(5, u"5.1").instanceId, 1u);
+    source->SetProductName(u"Later");
+    target = std::move(*source);
+    source.reset();
+    std::string const laterProduct = "Later, unit 0, 1 references\n5.1 -> 5 P5 (none) part\n";
+    EXPECT_EQ(Describe(target.GetInputProductStructure()), laterProduct);
+    EXPECT_EQ(Describe(later), laterProduct);
+    EXPECT_EQ(Describe(before), kProduct);
 }
 
-class TarvexUniqueReferencesCountTest : public ::testing::TestWithParam<UniqueCountCase> {};
-
-TEST_P(TarvexUniqueReferencesCountTest, CountsOrOverrides) {
+TEST(TarvexModelTest, MissingFilesComeOneAfterEachNextAndAFaultedNextDoesNotMove) {
     TarvexModel model;
-    GetParam().author(model);
-    EXPECT_EQ(model.GetInputProductStructure().GetUniqueReferencesCount(), GetParam().expected);
-}
-
-INSTANTIATE_TEST_SUITE_P(Cases, TarvexUniqueReferencesCountTest,
-                         ::testing::Values(UniqueCountCase{"Empty", [](TarvexModel&) {}, 0},
-                                           UniqueCountCase{"SharedPartCountsOnce",
-                                                           [](TarvexModel& m) {
-                                                               m.AddAssembly(1, u"A");
-                                                               m.AddAssembly(2, u"B");
-                                                               m.AddPart(3, u"P");
-                                                               m.AddRootInstance(1, u"a");
-                                                               m.AddRootInstance(2, u"b");
-                                                               m.AddInstance(1, 3, u"p1");
-                                                               m.AddInstance(2, 3, u"p2");
-                                                               m.AddInstance(2, 3, u"p3");
-                                                           },
-                                                           3},
-                                           UniqueCountCase{"UnplacedReferenceIsNotCounted",
-                                                           [](TarvexModel& m) {
-                                                               m.AddPart(1, u"P");
-                                                               m.AddPart(2, u"unplaced");
-                                                               m.AddRootInstance(1, u"p");
-                                                           },
-                                                           1},
-                                           UniqueCountCase{"PlacedButUndefinedIsNotCounted",
-                                                           [](TarvexModel& m) {
-                                                               m.AddPart(1, u"P");
-                                                               m.AddRootInstance(1, u"p");
-                                                               m.AddRootInstance(42, u"nowhere");
-                                                           },
-                                                           1},
-                                           UniqueCountCase{"AssemblyInsideItselfEnds",
-                                                           [](TarvexModel& m) {
-                                                               m.AddAssembly(1, u"A");
-                                                               m.AddRootInstance(1, u"a");
-                                                               m.AddInstance(1, 1, u"again");
-                                                           },
-                                                           1},
-                                           UniqueCountCase{"OverrideWins",
-                                                           [](TarvexModel& m) {
-                                                               m.AddPart(1, u"P");
-                                                               m.AddRootInstance(1, u"p");
-                                                               m.SetUniqueReferencesCount(7);
-                                                           },
-                                                           7},
-                                           UniqueCountCase{"OverrideOfZero",
-                                                           [](TarvexModel& m) {
-                                                               m.AddPart(1, u"P");
-                                                               m.AddRootInstance(1, u"p");
-                                                               m.SetUniqueReferencesCount(0);
-                                                           },
-                                                           0},
-                                           UniqueCountCase{"OverrideRemoved",
-                                                           [](TarvexModel& m) {
-                                                               m.AddPart(1, u"P");
-                                                               m.AddRootInstance(1, u"p");
-                                                               m.SetUniqueReferencesCount(7);
-                                                               m.SetUniqueReferencesCount(
-                                                                   std::nullopt);
-                                                           },
-                                                           1}),
-                         [](::testing::TestParamInfo<UniqueCountCase> const& info) {
-                             return info.param.name;
-                         });
-
-TEST(TarvexModelTest, ValueObjectsSeeAuthoringDoneAfterTheyWereHandedOut) {
-    TarvexModel model;
-    TarvexInputProductStructure const structure = model.GetInputProductStructure();
-    EXPECT_EQ(structure.GetRootInstancesCount(), 0);
-    model.AddPart(1, u"P");
-    model.AddRootInstance(1, u"p");
-    model.SetProductName(u"Later");
-    EXPECT_EQ(structure.GetRootInstancesCount(), 1);
-    EXPECT_EQ(TextOf(structure.GetProductName()), u"Later");
-}
-
-TEST(TarvexModelTest, ValueObjectsKeepTheDataAliveAfterTheModelIsGone) {
-    TarvexInputPSInstance root;
-    TarvexInputPSMissingFileIter missing;
-    TarvexDocumentInformation information;
-    {
-        TarvexModel const model = MakeFullModel();
-        root = model.GetInputProductStructure().GetRootInstance(0);
-        missing = model.GetImportResult().GetMissingFileIterator();
-        information = model.GetDocument().GetInformation();
+    model.AddMissingFile(u"a.prt");
+    model.AddMissingFile(std::nullopt);
+    model.AddMissingFile(u"c.prt");
+    TarvexFault fault = FaultOn("TarvexInputPSMissingFileIter::Next");
+    fault.times = 1;
+    model.Faults().Add(fault);
+    TarvexInputPSMissingFileIter missing = model.GetImportResult().GetMissingFileIterator();
+    EXPECT_EQ(missing.GetCount(), 3);
+    std::vector<std::string> seen{Text(missing.Current())};
+    EXPECT_THROW(missing.Next(), std::runtime_error);
+    while (missing.Next()) {
+        seen.push_back(Text(missing.Current()));
     }
-    EXPECT_EQ(TextOf(root.GetInstanceName()), u"Housing.1");
-    EXPECT_EQ(TextOf(root.GetReference().GetInstance(0).GetReference().GetReferenceName()),
-              u"Shaft");
-    ASSERT_TRUE(missing.Next());
-    EXPECT_EQ(TextOf(missing.Current()), u"bolt.prt");
-    TarvexWString author;
-    EXPECT_TRUE(information.GetAuthor(author));
-    EXPECT_EQ(TextOf(author), u"A. Author");
+    seen.push_back(Text(missing.Current()));
+    EXPECT_FALSE(missing.Next());
+    EXPECT_EQ(seen, (std::vector<std::string>{"(none)", "a.prt", "(none)", "c.prt", "(none)"}));
 }
 
-TEST(TarvexModelTest, MovingHandsTheDataOnAndLeavesAnEmptyModel) {
-    TarvexModel source = MakeFullModel();
-    TarvexInputProductStructure const before = source.GetInputProductStructure();
-    TarvexModel target = std::move(source);
+TEST(TarvexEntityTest, DescendsItsInstancePathToThePartEntity) {
+    TarvexModel const model = MakeTestProduct();
+    // Top.1, Sub.1, 30.1 down to face 30 of part 30, which "face-30" shows.
+    TarvexEntity current = model.MakeEntity(TarvexAuthoredEntity{{1, 4, 5}, 30, u"face-30", true});
+    std::string path;
+    TarvexInstanceEntity step;
+    TarvexVisuEntity part;
+    while (!current.GetPartEntity(part) && current.GetInstanceEntity(step)) {
+        path += Text(step.GetInstance().GetInstanceName()) + "/";
+        current = step.GetEntity();
+        EXPECT_EQ(current.GetEntityId(), 30u);
+    }
+    EXPECT_EQ(path, "Top.1/Sub.1/30.1/");
+    TarvexWString id;
+    ASSERT_TRUE(part.GetID(id));
+    EXPECT_EQ(Text(id), "face-30");
+    EXPECT_FALSE(current.GetInstanceEntity(step));
 
-    EXPECT_EQ(TextOf(target.GetInputProductStructure().GetProductName()), u"Gearbox");
-    EXPECT_EQ(before.GetRootInstancesCount(), 1);
-    // The moved-from model is still usable: first empty, then a new model of its own.
-    EXPECT_EQ(source.GetInputProductStructure().GetRootInstancesCount(), 0); // NOLINT
-    EXPECT_EQ(source.FindReference(10), nullptr);
-    source.AddPart(1, u"fresh");
-    EXPECT_EQ(source.AddRootInstance(1, u"one").instanceId, 1u);
-    EXPECT_EQ(source.GetInputProductStructure().GetRootInstancesCount(), 1);
-    EXPECT_EQ(target.GetInputProductStructure().GetRootInstancesCount(), 1);
+    // An entity that ends in no part is neither kind at the end of its path.
+    TarvexEntity const nowhere = model.MakeEntity(TarvexAuthoredEntity{{}, 0, u"x", false});
+    EXPECT_FALSE(nowhere.GetPartEntity(part));
+    EXPECT_FALSE(nowhere.GetInstanceEntity(step));
+    EXPECT_FALSE(TarvexEntity().GetPartEntity(part) || TarvexEntity().GetInstanceEntity(step));
+}
 
-    target = std::move(source);
-    EXPECT_EQ(TextOf(target.GetInputProductStructure().GetRootInstance(0).GetInstanceName()),
-              u"one");
-    EXPECT_EQ(TextOf(before.GetProductName()), u"Gearbox");
+// Every unit with its text and length in metres; Unknown, and values outside the table, have
+// no text and no length, and every factor to or from them is 1.
+TEST(TarvexLengthUnitUtilsTest, GivesEachUnitItsTextAndTheFactorsBetweenThem) {
+    std::tuple<int, char const*, double> const units[] = {
+        {0, "(none)", 0},  {1, "m", 1},         {2, "cm", 0.01},     {3, "in", 0.0254},
+        {4, "mm", 0.001},  {5, "ft", 0.3048},   {6, "um", 0.000001}, {7, "km", 1000},
+        {8, "yd", 0.9144}, {9, "mi", 1609.344}, {10, "(none)", 0},   {-1, "(none)", 0}};
+    for (auto const& [from, text, fromMetres] : units) {
+        auto const unit = [](int value) { return static_cast<TarvexLengthUnitType>(value); };
+        EXPECT_EQ(Text(TarvexLengthUnitUtils::LengthUnitToString(unit(from))), text);
+        for (auto const& [to, toText, toMetres] : units) {
+            double const expected = fromMetres == 0 || toMetres == 0 ? 1 : fromMetres / toMetres;
+            EXPECT_NEAR(TarvexLengthUnitUtils::GetScalingFactor(unit(from), unit(to)), expected,
+                        expected * 1e-12)
+                << from << " to " << to << " (" << toText << ")";
+        }
+    }
 }
 
 } // namespace
