@@ -1,22 +1,27 @@
 #include <VizBridge/stepinput/StepDocument.h>
 
+#include <VizBridge/stepinput/StepAnnotationReader.h>
 #include <VizBridge/stepinput/StepFileCheck.h>
+#include <VizBridge/stepinput/StepGdtReferences.h>
 #include <VizBridge/stepinput/StepPartMesher.h>
 #include <VizBridge/stepinput/StepReadError.h>
 #include <VizBridge/stepinput/StepStructureReader.h>
 #include <VizBridge/stepinput/StepText.h>
+#include <VizBridge/stepinput/StepViewReader.h>
+#include <VizBridge/stepinput/XcafDocument.h>
 
 #include <HeaderSection_FileDescription.hxx>
 #include <HeaderSection_FileName.hxx>
+#include <Interface_Check.hxx>
+#include <Interface_CheckIterator.hxx>
 #include <Message.hxx>
 #include <Message_Messenger.hxx>
 #include <Message_PrinterOStream.hxx>
 #include <STEPCAFControl_Reader.hxx>
-#include <STEPControl_Controller.hxx>
+#include <Standard_Failure.hxx>
 #include <StepData_StepModel.hxx>
 #include <TColStd_SequenceOfAsciiString.hxx>
 #include <TDocStd_Document.hxx>
-#include <XCAFApp_Application.hxx>
 #include <XSControl_WorkSession.hxx>
 
 #include <filesystem>
@@ -25,6 +30,9 @@
 namespace VizBridgeStep {
 
 namespace {
+
+/// How many of the entities that failed to read the notes name one by one.
+constexpr int kReportedChecks = 5;
 
 /// Open CASCADE's reader keeps process-wide settings and prints to standard output: one read
 /// at a time, and its printers are taken away while it runs.
@@ -107,9 +115,21 @@ std::shared_ptr<StepDocument> StepDocument::Read(std::string const& path,
 
     std::lock_guard<std::mutex> const lock(readerLock());
     SilentMessenger const silent;
-    STEPControl_Controller::Init();
-    Handle(TDocStd_Document) xcaf;
-    XCAFApp_Application::GetApplication()->NewDocument("MDTV-XCAF", xcaf);
+    try {
+        document->readLocked(path, options);
+    } catch (Standard_Failure const& failure) {
+        // Open CASCADE's own exceptions are no std::exception: a host sees them as a file
+        // that cannot be read, with what Open CASCADE said.
+        throw StepReadError(path + ": Open CASCADE failed reading it (" +
+                            failure.DynamicType()->Name() + ": " + failure.GetMessageString() +
+                            ")");
+    }
+    return document;
+}
+
+void StepDocument::readLocked(std::string const& path, StepReadOptions const& options) {
+    XcafDocument const document;
+    Handle(TDocStd_Document) xcaf = document.Get();
     STEPCAFControl_Reader reader;
     reader.SetColorMode(true);
     reader.SetNameMode(true);
@@ -122,11 +142,30 @@ std::shared_ptr<StepDocument> StepDocument::Read(std::string const& path,
         Handle(StepData_StepModel)::DownCast(reader.ChangeReader().WS()->Model());
     if (model.IsNull() || model->NbEntities() == 0)
         throw StepReadError(path + ": the file holds no entity");
+    StepUnboundItems unbound(path, model);
+    // Entities the reader could not take (a reference to an entity the file lacks, a wrong
+    // parameter) are left out of the transfer: say so, and the first few.
+    Interface_CheckIterator const checks = reader.ChangeReader().WS()->ModelCheckList();
+    int failed = 0;
+    for (checks.Start(); checks.More(); checks.Next()) {
+        Handle(Interface_Check) const& check = checks.Value();
+        if (!check->HasFailed())
+            continue;
+        if (++failed > kReportedChecks)
+            continue;
+        std::string const where = check->Entity().IsNull()
+                                      ? std::string("the file")
+                                      : "#" + std::to_string(model->IdentLabel(check->Entity()));
+        m_notes.push_back(where + ": " + check->CFail(1));
+    }
+    if (failed > kReportedChecks)
+        m_notes.push_back(std::to_string(failed - kReportedChecks) +
+                          " more entities could not be read");
     if (!reader.Transfer(xcaf))
         throw StepReadError(path + ": no shape could be transferred from the file");
 
-    TarvexAuthoredDocument& strings = document->m_model.Document();
-    strings.formatType = VizPort::Widen(document->m_schema);
+    TarvexAuthoredDocument& strings = m_model.Document();
+    strings.formatType = VizPort::Widen(m_schema);
     if (model->HasHeaderEntity(STANDARD_TYPE(HeaderSection_FileName))) {
         Handle(HeaderSection_FileName) const name = Handle(HeaderSection_FileName)::DownCast(
             model->HeaderEntity(STANDARD_TYPE(HeaderSection_FileName)));
@@ -151,26 +190,30 @@ std::shared_ptr<StepDocument> StepDocument::Read(std::string const& path,
         bool known = false;
         for (UnitName const& candidate : kUnits) {
             if (unit == candidate.stepName) {
-                document->m_model.SetUnits(candidate.unit);
+                m_model.SetUnits(candidate.unit);
                 strings.unit = VizPort::WString(candidate.text);
                 known = true;
             }
         }
         if (!known)
-            document->m_notes.push_back("length unit " + unit + " is not one the model knows");
+            m_notes.push_back("length unit " + unit + " is not one the model knows");
     }
 
-    StepStructureReader structure(xcaf, document->m_model, document->m_parts, document->m_counts,
-                                  document->m_notes);
+    StepStructureReader structure(xcaf, m_model, m_parts, m_counts, m_notes);
     structure.Read(VizPort::Widen(std::filesystem::path(path).stem().string()));
-    if (document->m_parts.empty())
+    if (m_parts.empty())
         throw StepReadError(path + ": the file holds no part with geometry");
-    for (StepPart const& part : document->m_parts) {
-        TarvexAuthoredReference* const reference =
-            document->m_model.FindReference(part.referenceId);
-        document->m_counts.triangles += StepPartMesher::Mesh(part, options, *reference);
+    for (StepPart const& part : m_parts) {
+        TarvexAuthoredReference* const reference = m_model.FindReference(part.referenceId);
+        m_counts.triangles += StepPartMesher::Mesh(part, options, *reference);
     }
-    return document;
+    StepGdtReferences::Check(xcaf, m_parts, m_counts, m_notes);
+    // The PMI links the parts' faces, and the views list the PMI: in that order, after the
+    // meshes. Both read the entities that the reader keeps in its work session.
+    Handle(XSControl_WorkSession) const session = reader.ChangeReader().WS();
+    StepAnnotationReader annotations(session, unbound, m_parts, m_model, m_counts, m_notes);
+    annotations.Read();
+    StepViewReader(session, annotations, m_parts, m_model, m_counts, m_notes).Read();
 }
 
 } // namespace VizBridgeStep

@@ -15,10 +15,13 @@ struct StepCounts {
     int parts = 0;
     int assemblies = 0;
     int instances = 0;
-    int faces = 0;     ///< of all parts, each part counted once
-    int triangles = 0; ///< of the parts' meshes
-    int pmi = 0;       ///< annotations with graphical PMI
-    int views = 0;     ///< saved views
+    int faces = 0;             ///< of all parts, each part counted once
+    int triangles = 0;         ///< of the parts' meshes
+    int pmi = 0;               ///< annotations with graphical PMI
+    int views = 0;             ///< saved views
+    int gdtObjects = 0;        ///< semantic dimensions, tolerances and datums
+    int gdtFaceReferences = 0; ///< faces that they refer to, once per object
+    int gdtResolvedFaces = 0;  ///< of those, the faces that have an id in a part
 };
 
 /// A STEP AP203/AP214/AP242 file read through Open CASCADE into the import library's model:
@@ -53,6 +56,8 @@ public:
 
 private:
     StepDocument() = default;
+    /// The reading itself, under the reader lock; Open CASCADE's exceptions pass.
+    void readLocked(std::string const& path, StepReadOptions const& options);
 
     TarvexModel m_model;
     std::vector<StepPart> m_parts;

@@ -9,8 +9,17 @@
 #include <optional>
 #include <vector>
 
+/// The glyphs of a text as its document already holds them, laid out in the part's
+/// coordinates: outlines as closed polylines and filled shapes as faces. CAD files that carry
+/// PMI as tessellated presentation give their texts this way, often with no string at all.
+struct TarvexAuthoredVisuGlyphs {
+    std::vector<TarvexAuthoredVisuEdge> strokes;
+    std::vector<TarvexAuthoredVisuFace> faces;
+};
+
 /// A text of a PMI: the string, where it stands and how it runs. The direction runs along
-/// the text; the normal faces the reader.
+/// the text; the normal faces the reader. A text with glyphs is drawn as those glyphs; its
+/// string, if any, only names it.
 struct TarvexAuthoredVisuText {
     std::optional<VizPort::WString> text;
     std::array<float, 3> anchor = {0, 0, 0};
@@ -19,6 +28,8 @@ struct TarvexAuthoredVisuText {
     std::optional<TarvexAuthoredVisuFont> font;
     std::optional<std::array<unsigned short, 3>> rgb;
     std::optional<unsigned short> alpha;
+    // Initialised here so that texts described member by member may leave it out.
+    std::optional<TarvexAuthoredVisuGlyphs> glyphs = std::nullopt;
 };
 
 /// A tessellated PMI: its lines, its texts and the entities it points at.

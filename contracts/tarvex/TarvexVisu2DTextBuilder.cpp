@@ -8,9 +8,11 @@
 #include <VizBridge/contracts/tarvex/TarvexVisuFont.h>
 #include <VizBridge/contracts/tarvex/TarvexVisuText.h>
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 #include <functional>
+#include <optional>
 #include <stdexcept>
 #include <string>
 
@@ -145,12 +147,47 @@ std::optional<TarvexAuthoredVisuFace> fill(TarvexPolygonTriangulator::Triangulat
     return face;
 }
 
+/// Whether every offset of `indices` starts a whole point of `coordinates`.
+bool pointsInto(std::optional<std::vector<int>> const& indices,
+                std::vector<float> const& coordinates) {
+    return !indices || std::all_of(indices->begin(), indices->end(), [&](int offset) {
+        return offset >= 0 && std::size_t(offset) + 3 <= coordinates.size();
+    });
+}
+
+void checkGlyphs(TarvexAuthoredVisuGlyphs const& glyphs) {
+    for (TarvexAuthoredVisuEdge const& stroke : glyphs.strokes) {
+        if (!pointsInto(stroke.lineIndices, stroke.points)) {
+            reject("a stroke of the glyphs has indices outside its points");
+        }
+    }
+    for (TarvexAuthoredVisuFace const& face : glyphs.faces) {
+        for (TarvexAuthoredVisuPolygon const& polygon : face.polygons) {
+            if (!pointsInto(polygon.indices, face.vertices) ||
+                !pointsInto(polygon.indices, face.normals)) {
+                reject("a face of the glyphs has indices outside its vertices");
+            }
+        }
+    }
+}
+
 } // namespace
 
 TarvexVisuBuild2DTextResult TarvexVisu2DTextBuilder::Build2DText(TarvexVisuText const& text,
                                                                  TarvexVisuFont const& font) const {
     text.m_context.Check("TarvexVisu2DTextBuilder::Build2DText");
     TarvexAuthoredVisuText const* const record = text.m_record.get();
+    if (record != nullptr && record->glyphs) {
+        // Shared with the import's data, which the result's pieces point into anyway.
+        TarvexAuthoredVisuGlyphs const& glyphs = *record->glyphs;
+        checkGlyphs(glyphs);
+        return TarvexVisuBuild2DTextResult(
+            text.m_context,
+            std::shared_ptr<std::vector<TarvexAuthoredVisuEdge> const>(text.m_record,
+                                                                       &glyphs.strokes),
+            std::shared_ptr<std::vector<TarvexAuthoredVisuFace> const>(text.m_record,
+                                                                       &glyphs.faces));
+    }
     if (record == nullptr || !record->text || record->text->empty()) {
         reject("there is no text");
     }

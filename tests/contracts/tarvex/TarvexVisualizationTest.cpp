@@ -87,9 +87,12 @@ TarvexAuthoredVisuText Text(std::optional<VizPort::WString> string, Font font = 
 
 /// Builds `text`, with its own font, as a PMI text of an imported part.
 TarvexVisuBuild2DTextResult Build(TarvexAuthoredVisuText const& text,
-                                  std::optional<std::string> const& fontDirectory = {}) {
+                                  std::optional<std::string> const& fontDirectory = {},
+                                  std::optional<TarvexFault> const& fault = {}) {
     TarvexVisuTestModel test;
     test.model.SetFontDirectory(fontDirectory);
+    if (fault)
+        test.model.Faults().Add(*fault);
     test.Visu().nodes.emplace_back().pmi.texts.push_back(text);
     TarvexVisuText const read = Items(test.Nodes().at(0).GetPMI().GetTextIterator()).at(0);
     TarvexVisuFont font;
@@ -210,6 +213,31 @@ TEST(TarvexVisu2DTextBuilderTest, TheFontShapesTheText) {
     EXPECT_EQ(TarvexFontCache::FileNameFor(u"Microsoft Sans Serif"), "DejaVuSans.ttf");
     EXPECT_GT(Lay(Text(u"iiii", {u"Courier New", {}, {}, {}})).Extent(0),
               1.5 * Lay(Text(u"iiii")).Extent(0));
+}
+
+TEST(TarvexVisu2DTextBuilderTest, GivesTheGlyphsItsDocumentHoldsAsTheyAre) {
+    // Neither a string nor a font that could lay one out is needed.
+    TarvexAuthoredVisuText text = Text(std::nullopt, {{}, -1, {}, {}});
+    text.glyphs = TarvexAuthoredVisuGlyphs{
+        {{{}, {7, 0, 0, 9, 0, 0}, {{0, 3}}, TarvexVisuLine_Polyline, {}, {}}},
+        {{{},
+          {},
+          {0, 0, 0, 2, 0, 0, 0, 3, 0},
+          {0, 0, 1, 0, 0, 1, 0, 0, 1},
+          {{{{0, 3, 6}}}},
+          {},
+          {}}}};
+    Layout const layout = Lay(text);
+    EXPECT_EQ(layout.strokes + layout.faces, 2);
+    EXPECT_FALSE(layout.closed) << "a stroke keeps its own line type";
+    EXPECT_NEAR(layout.area, 3, 1e-6);
+    EXPECT_NEAR(layout.high[0], 9, 1e-6);
+    EXPECT_EQ(
+        Outcome([&text] { Build(text, {}, FaultOn("TarvexVisu2DTextBuilder::Build2DText")); }),
+        "TarvexVisu2DTextBuilder::Build2DText");
+    text.glyphs->faces[0].polygons[0].indices->push_back(9);
+    EXPECT_EQ(Outcome([&text] { Build(text); }), "TarvexVisu2DTextBuilder::Build2DText: a face of "
+                                                 "the glyphs has indices outside its vertices");
 }
 
 TEST(TarvexVisu2DTextBuilderTest, RefusesWhatItCannotLayOutAndSaysWhy) {
