@@ -5,13 +5,38 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <filesystem>
 #include <fstream>
 #include <string>
 #include <unistd.h>
 
+namespace {
+
+/// The reader takes a path: one scratch file per fuzzing process, gone when it ends.
+class ScratchFile {
+public:
+    ScratchFile()
+        : m_path((std::filesystem::temp_directory_path() /
+                  ("vizbridge-fuzz-" + std::to_string(getpid()) + ".stp"))
+                     .string()) {}
+    ~ScratchFile() {
+        std::error_code ignored;
+        std::filesystem::remove(m_path, ignored);
+    }
+    ScratchFile(ScratchFile const&) = delete;
+    ScratchFile& operator=(ScratchFile const&) = delete;
+
+    std::string const& Path() const { return m_path; }
+
+private:
+    std::string m_path;
+};
+
+} // namespace
+
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
-    // The reader takes a path: one scratch file per fuzzing process.
-    static std::string const path = "/tmp/vizbridge-fuzz-" + std::to_string(getpid()) + ".stp";
+    static ScratchFile const scratch;
+    std::string const& path = scratch.Path();
     {
         std::ofstream file(path, std::ios::binary | std::ios::trunc);
         file.write(reinterpret_cast<char const*>(data), static_cast<std::streamsize>(size));

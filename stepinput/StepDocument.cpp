@@ -136,6 +136,9 @@ void StepDocument::readLocked(std::string const& path, StepReadOptions const& op
     reader.SetLayerMode(true);
     reader.SetGDTMode(true);
     reader.SetViewMode(true);
+    // Validation properties (volumes, areas, centroids) are no business of the model, and
+    // Open CASCADE 7.6 crashes reading them from a file whose references dangle.
+    reader.SetPropsMode(false);
     if (reader.ReadFile(path.c_str()) != IFSelect_RetDone)
         throw StepReadError(path + ": the file could not be parsed as STEP");
     Handle(StepData_StepModel) const model =

@@ -141,6 +141,13 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
     std::size_t const shellLine = valid.rfind('\n', shell) + 1;
     std::size_t const shellEnd = valid.find('\n', shell) + 1;
     std::string const dangling = valid.substr(0, shellLine) + valid.substr(shellEnd);
+    // CTC 03 without the records of its file lines 766 to 1855 (annotation coordinates,
+    // validation properties and more), which the records left still point at.
+    std::ifstream ctc3(StepTestFiles::Data("nist_ctc_03_asme1_ap242-e2.stp"), std::ios::binary);
+    std::string cut, line;
+    for (int number = 1; std::getline(ctc3, line); ++number)
+        if (number < 766 || number > 1855)
+            cut += line + "\n";
     std::string wrongSchema = valid;
     std::size_t const schemaAt = wrongSchema.find("FILE_SCHEMA");
     wrongSchema.replace(schemaAt, wrongSchema.find(';', schemaAt) - schemaAt,
@@ -160,6 +167,7 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
          "the file is truncated (no END-ISO-10303-21;)"},
         {"ifc.stp", wrongSchema, "the schema IFC2X3 is not one of AP203, AP214 or AP242"},
         {"dangling.stp", dangling, "the file holds no part with geometry"},
+        {"cut.stp", cut, "the file holds no part with geometry"},
         {"nothing.stp", StepTestFiles::EmptyDataFile(), "the file holds no entity"},
     };
     for (BadCase const& c : cases) {
