@@ -26,6 +26,7 @@
 
 #include <filesystem>
 #include <mutex>
+#include <string_view>
 
 namespace VizBridgeStep {
 
@@ -77,6 +78,12 @@ std::optional<VizPort::WString> joined(Handle(Interface_HArray1OfHAsciiString) c
         out += (out.empty() ? u"" : u"; ") + one;
     }
     return out.empty() ? std::nullopt : std::optional<VizPort::WString>(out);
+}
+
+/// Whether `entity` is geometry or topology that the shape transfer builds on.
+bool isShapeEntity(Standard_Transient const& entity) {
+    std::string_view const type = entity.DynamicType()->Name();
+    return type.rfind("StepGeom_", 0) == 0 || type.rfind("StepShape_", 0) == 0;
 }
 
 struct UnitName {
@@ -154,6 +161,12 @@ void StepDocument::readLocked(std::string const& path, StepReadOptions const& op
         Handle(Interface_Check) const& check = checks.Value();
         if (!check->HasFailed())
             continue;
+        // Open CASCADE's shape transfer follows the fields of geometry and topology entities
+        // unchecked: one that could not be read crashes it. Such a file is refused.
+        if (!check->Entity().IsNull() && isShapeEntity(*check->Entity()))
+            throw StepReadError(path + ": its geometry is broken at #" +
+                                std::to_string(model->IdentLabel(check->Entity())) + " (" +
+                                check->CFail(1) + ")");
         if (++failed > kReportedChecks)
             continue;
         std::string const where = check->Entity().IsNull()
