@@ -43,7 +43,7 @@ private:
     std::uint32_t m_id = 0;
     std::uint32_t m_parentId = 0;
     std::uint32_t m_type = 0xFFFFFFFFu;
-    std::uint32_t m_reserved = 0;
+    [[maybe_unused]] std::uint32_t m_reserved = 0; // keeps the interface's 16-byte layout
 };
 
 } // namespace KolbaVizCore
