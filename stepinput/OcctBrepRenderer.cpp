@@ -1,26 +1,21 @@
 #include <VizBridge/stepinput/OcctBrepRenderer.h>
 
 #include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
-#include <VizBridge/contracts/kolba/BodyContext.h>
 #include <VizBridge/contracts/kolba/EntityContext.h>
 #include <VizBridge/contracts/kolba/EntityType.h>
 #include <VizBridge/contracts/kolba/EntityTypeContext.h>
-#include <VizBridge/contracts/kolba/Node.h>
 #include <VizBridge/contracts/kolba/RGBAColor.h>
 #include <VizBridge/contracts/kolba/SceneBuilder.h>
-#include <VizBridge/contracts/kolba/SceneLevelContext.h>
 #include <VizBridge/contracts/kolba/TriangleType.h>
 #include <VizBridge/contracts/kolba/VizBox.h>
 #include <VizBridge/stepinput/OcctPartContainer.h>
+#include <VizBridge/stepinput/StepPartMesher.h>
 
-#include <BRepAdaptor_Curve.hxx>
 #include <BRepBuilderAPI_Copy.hxx>
 #include <BRepMesh_IncrementalMesh.hxx>
 #include <BRep_Tool.hxx>
-#include <GCPnts_TangentialDeflection.hxx>
 #include <GeomLProp_SLProps.hxx>
 #include <Geom_Surface.hxx>
-#include <Poly_PolygonOnTriangulation.hxx>
 #include <Poly_Triangulation.hxx>
 #include <TopExp.hxx>
 #include <TopTools_IndexedDataMapOfShapeListOfShape.hxx>
@@ -29,39 +24,19 @@
 #include <TopoDS_Face.hxx>
 
 #include <array>
-#include <cmath>
 #include <cstddef>
 #include <initializer_list>
 #include <optional>
-#include <string>
 #include <utility>
 #include <vector>
 
 namespace VizBridgeStep {
 
-using KolbaVizCore::EntityId;
-using KolbaVizCore::Node;
 using KolbaVizCore::RenderId;
 using KolbaVizCore::RGBAColor;
 using KolbaVizCore::SceneBuilder;
 
 namespace {
-
-// Offsets from the length of the part node's path, where the product renderer reads them.
-constexpr int BodyIndex = 2;   ///< the body's tag: the parent id of a face or edge
-constexpr int TypeIndex = 3;   ///< Faces or Edges
-constexpr int EntityIndex = 4; ///< the face's or edge's id
-
-VizPort::WString numbered(char const* word, std::uint32_t number) {
-    return VizPort::Widen(word + std::to_string(number));
-}
-
-/// The node below `path` that `tags` lead to, as a path.
-RenderId below(RenderId path, std::initializer_list<std::uint32_t> tags) {
-    for (std::uint32_t const tag : tags)
-        path.AddValue(tag);
-    return path;
-}
 
 void addPoint(std::vector<float>& out, gp_XYZ const& point) {
     out.insert(out.end(), {static_cast<float>(point.X()), static_cast<float>(point.Y()),
@@ -159,39 +134,6 @@ FaceTriangles meshOf(TopoDS_Face const& face, StepReadOptions const& options) {
     return trianglesOf(copy, *again, location);
 }
 
-/// The points of `edge` as a polyline: its polygon on a meshed face around it, so that it
-/// meets that face's triangles, else its curve sampled within the deflections.
-std::vector<float> edgePoints(TopoDS_Edge const& edge,
-                              TopTools_IndexedDataMapOfShapeListOfShape const& facesOfEdges,
-                              StepReadOptions const& options) {
-    std::vector<float> points;
-    if (int const index = facesOfEdges.FindIndex(edge)) {
-        for (TopoDS_Shape const& face : facesOfEdges(index)) {
-            TopLoc_Location location;
-            Handle(Poly_Triangulation) const mesh =
-                BRep_Tool::Triangulation(TopoDS::Face(face), location);
-            if (mesh.IsNull())
-                continue;
-            Handle(Poly_PolygonOnTriangulation) const polygon =
-                BRep_Tool::PolygonOnTriangulation(edge, mesh, location);
-            if (polygon.IsNull())
-                continue;
-            gp_Trsf const trsf = location.Transformation();
-            for (int node = 1; node <= polygon->NbNodes(); ++node)
-                addPoint(points, mesh->Node(polygon->Node(node)).Transformed(trsf).XYZ());
-            return points;
-        }
-    }
-    if (!BRep_Tool::IsGeometric(edge))
-        return points;
-    BRepAdaptor_Curve const curve(edge);
-    GCPnts_TangentialDeflection const sampled(curve, options.angularDeflection,
-                                              options.linearDeflection);
-    for (int i = 1; i <= sampled.NbPoints(); ++i)
-        addPoint(points, sampled.Value(i).XYZ());
-    return points;
-}
-
 RGBAColor opaque(std::array<std::uint8_t, 3> const& rgb) {
     return RGBAColor(rgb[0], rgb[1], rgb[2], 255);
 }
@@ -200,146 +142,9 @@ RGBAColor opaque(std::array<std::uint8_t, 3> const& rgb) {
 
 OcctBrepRenderer::OcctBrepRenderer(OcctPartContainer const& container, SceneBuilder& builder,
                                    RenderId current)
-    : ARenderer(&builder, nullptr), m_container(&container), m_current(std::move(current)) {}
+    : BrepPartRenderer(builder, std::move(current)), m_container(&container) {}
 
 OcctBrepRenderer::~OcctBrepRenderer() = default;
-
-bool OcctBrepRenderer::Render() {
-    SceneBuilder* const builder = getSceneBuilder();
-    RenderId parentPath;
-    if (builder == nullptr || !builder->GetCurrentRenderId(parentPath))
-        return false;
-    if (!GetRenderId().IsEmpty()) {
-        // Entity nodes are never reused: drawing again would double every face and edge.
-        if (partNode() != nullptr)
-            return true;
-        renderId().Clear(); // someone removed the drawing: draw it anew
-    }
-    // The caller records the part node's path and tells its own instance from the others
-    // by cutting one tag off it: below another node, that test would fail.
-    if (!m_current.IsEmpty() && m_current.GetTags() != parentPath.GetTags())
-        return false;
-    // A part node that is there already is another renderer's drawing; opening its tag
-    // would reuse it and add a second set of faces.
-    Node const* const parent = builder->FindNode(parentPath);
-    if (parent == nullptr || parent->FindChild(PartTag) != nullptr)
-        return false;
-
-    KolbaVizCore::SceneLevelContext const part(builder, PartTag, u"BrepPart");
-    if (!part.IsOK())
-        return false;
-    RenderId path;
-    builder->GetCurrentRenderId(path);
-    setRenderId(path);
-    drawBrep(*builder);
-    return true;
-}
-
-void OcctBrepRenderer::ClearAll() {
-    SceneBuilder* const builder = getSceneBuilder();
-    // A drawing that was removed already leaves nothing to remove; the answer says no more.
-    if (builder != nullptr && !GetRenderId().IsEmpty())
-        builder->RemoveNode(GetRenderId());
-    renderId().Clear();
-}
-
-bool OcctBrepRenderer::Convert(RenderId const& id, EntityId& entity) {
-    int const base = GetRenderId().Length();
-    if (GetRenderId().IsEmpty() || id.Length() <= base + BodyIndex || !leadsIntoDrawing(id))
-        return false;
-    std::uint32_t const body = id[base + BodyIndex];
-    if (body != bodyTag())
-        return false;
-    if (id.Length() <= base + EntityIndex) {
-        entity = EntityId(body, KolbaVizCore::Body, body);
-        return true;
-    }
-    std::uint32_t const type = id[base + TypeIndex];
-    std::uint32_t const entityId = id[base + EntityIndex];
-    if (!hasEntity(type, entityId))
-        return false;
-    entity = EntityId(body, type, entityId);
-    return true;
-}
-
-bool OcctBrepRenderer::Convert(EntityId const& entity, RenderId& id) {
-    SceneBuilder* const builder = getSceneBuilder();
-    std::uint32_t const body = bodyTag();
-    if (builder == nullptr || GetRenderId().IsEmpty() || entity.GetParentId() != body)
-        return false;
-    RenderId const bodyPath = below(GetRenderId(), {BrepTag, KolbaVizCore::Body, body});
-    RenderId path;
-    if (entity.GetType() == KolbaVizCore::Body && entity.GetId() == body)
-        path = bodyPath;
-    else if (hasEntity(entity.GetType(), entity.GetId()))
-        path = below(bodyPath, {entity.GetType(), entity.GetId()});
-    else
-        return false;
-    // A refused level left its entities out of the scene: no path for them.
-    if (builder->FindNode(path) == nullptr)
-        return false;
-    path.SetLeading(1);
-    id = std::move(path);
-    return true;
-}
-
-bool OcctBrepRenderer::ConvertToHighlight(RenderId const& id, RenderId*& ids, int& count) {
-    if (GetRenderId().IsEmpty() || !leadsIntoDrawing(id))
-        return false;
-    // The interface hands the array to the caller, who releases it with delete[].
-    ids = new RenderId[1]{id};
-    count = 1;
-    return true;
-}
-
-void OcctBrepRenderer::GetGeometryCenter(float* const center) const {
-    float box[6];
-    GetGeometryBox(box);
-    for (int axis = 0; axis < 3; ++axis)
-        center[axis] = box[axis] > box[axis + 3] ? 0.0f : (box[axis] + box[axis + 3]) / 2.0f;
-}
-
-float OcctBrepRenderer::GetGeometryRadius() const {
-    float box[6];
-    GetGeometryBox(box);
-    double sum = 0.0;
-    for (int axis = 0; axis < 3; ++axis) {
-        if (box[axis] > box[axis + 3])
-            return 0.0f;
-        double const extent = static_cast<double>(box[axis + 3]) - box[axis];
-        sum += extent * extent;
-    }
-    return static_cast<float>(std::sqrt(sum) / 2.0);
-}
-
-void OcctBrepRenderer::GetGeometryBox(float* const box) const {
-    VizBridgeTarvex::VizBox const part =
-        GetRenderId().IsEmpty() ? VizBridgeTarvex::VizBox() : m_container->GetBox();
-    for (int axis = 0; axis < 3; ++axis) {
-        box[axis] = static_cast<float>(part.GetLow()[axis]);
-        box[axis + 3] = static_cast<float>(part.GetHigh()[axis]);
-    }
-}
-
-bool OcctBrepRenderer::preRender() {
-    return true;
-}
-
-void OcctBrepRenderer::postRender() {}
-
-void OcctBrepRenderer::drawBrep(SceneBuilder& builder) const {
-    KolbaVizCore::SceneLevelContext const brep(&builder, BrepTag, u"Brep");
-    if (!brep.IsOK())
-        return;
-    KolbaVizCore::EntityTypeContext const bodies(&builder, KolbaVizCore::Body, u"Bodies");
-    if (!bodies.IsOK())
-        return;
-    KolbaVizCore::BodyContext const body(&builder, bodyTag(), numbered("Body", bodyTag()));
-    if (!body.IsOK())
-        return;
-    drawFaces(builder);
-    drawEdges(builder);
-}
 
 void OcctBrepRenderer::drawFaces(SceneBuilder& builder) const {
     StepPart const& part = m_container->GetPart();
@@ -389,31 +194,12 @@ void OcctBrepRenderer::drawEdges(SceneBuilder& builder) const {
         KolbaVizCore::EntityContext const entity(&builder, id, numbered("Edge", id), false, {});
         if (!entity.IsOK() || factory == nullptr)
             continue;
-        std::vector<float> const points =
-            edgePoints(TopoDS::Edge(part.edges(index)), facesOfEdges, m_container->GetOptions());
+        std::vector<float> const points = StepPartMesher::EdgePoints(
+            TopoDS::Edge(part.edges(index)), facesOfEdges, m_container->GetOptions());
         // An edge of fewer than two points is refused by the factory and keeps an empty node.
         builder.AddGeometryItem(
             factory->MakePolyline(id, points.data(), static_cast<unsigned int>(points.size())));
     }
-}
-
-Node const* OcctBrepRenderer::partNode() const {
-    SceneBuilder const* const builder = getSceneBuilder();
-    if (builder == nullptr || GetRenderId().IsEmpty())
-        return nullptr;
-    return builder->FindNode(GetRenderId());
-}
-
-bool OcctBrepRenderer::leadsIntoDrawing(RenderId const& id) const {
-    Node const* const part = partNode();
-    int const base = GetRenderId().Length();
-    if (part == nullptr || id.Length() < base)
-        return false;
-    // The head of the path must reach this very node: through a referencing node the
-    // path differs from the drawing's own, and still names the same shared subtree.
-    RenderId head = id;
-    head.SetLength(base);
-    return getSceneBuilder()->FindNode(head) == part && getSceneBuilder()->FindNode(id) != nullptr;
 }
 
 std::uint32_t OcctBrepRenderer::bodyTag() const {
@@ -423,6 +209,10 @@ std::uint32_t OcctBrepRenderer::bodyTag() const {
 bool OcctBrepRenderer::hasEntity(std::uint32_t type, std::uint32_t id) const {
     return (type == KolbaVizCore::Face && m_container->HasFace(id)) ||
            (type == KolbaVizCore::Edge && m_container->HasEdge(id));
+}
+
+KolbaVizCore::VizBox OcctBrepRenderer::partBox() const {
+    return m_container->GetBox();
 }
 
 } // namespace VizBridgeStep

@@ -31,38 +31,6 @@ void addPoint(std::vector<float>& out, gp_Pnt const& point) {
                            static_cast<float>(point.Z())});
 }
 
-/// The points of `edge` as a polyline: its polygon on a meshed face if it has one, else its
-/// curve sampled within the deflections.
-std::vector<float> edgePoints(TopoDS_Edge const& edge,
-                              TopTools_IndexedDataMapOfShapeListOfShape const& facesOfEdges,
-                              StepReadOptions const& options) {
-    std::vector<float> points;
-    if (int const index = facesOfEdges.FindIndex(edge)) {
-        for (TopoDS_Shape const& face : facesOfEdges(index)) {
-            TopLoc_Location location;
-            Handle(Poly_Triangulation) const mesh =
-                BRep_Tool::Triangulation(TopoDS::Face(face), location);
-            if (mesh.IsNull())
-                continue;
-            Handle(Poly_PolygonOnTriangulation) const polygon =
-                BRep_Tool::PolygonOnTriangulation(edge, mesh, location);
-            if (polygon.IsNull())
-                continue;
-            for (int node = 1; node <= polygon->NbNodes(); ++node)
-                addPoint(points, mesh->Node(polygon->Node(node)).Transformed(location));
-            return points;
-        }
-    }
-    if (!BRep_Tool::IsGeometric(edge))
-        return points;
-    BRepAdaptor_Curve const curve(edge);
-    GCPnts_TangentialDeflection const sampled(curve, options.angularDeflection,
-                                              options.linearDeflection);
-    for (int i = 1; i <= sampled.NbPoints(); ++i)
-        addPoint(points, sampled.Value(i));
-    return points;
-}
-
 TarvexAuthoredVisuEdge visuEdge(std::vector<float> points, std::optional<VizPort::WString> id) {
     TarvexAuthoredVisuEdge edge;
     edge.mechanicalId = std::move(id);
@@ -140,6 +108,37 @@ int meshFace(StepPart const& part, int index, TarvexAuthoredReference& reference
 
 } // namespace
 
+std::vector<float>
+StepPartMesher::EdgePoints(TopoDS_Edge const& edge,
+                           TopTools_IndexedDataMapOfShapeListOfShape const& facesOfEdges,
+                           StepReadOptions const& options) {
+    std::vector<float> points;
+    if (int const index = facesOfEdges.FindIndex(edge)) {
+        for (TopoDS_Shape const& face : facesOfEdges(index)) {
+            TopLoc_Location location;
+            Handle(Poly_Triangulation) const mesh =
+                BRep_Tool::Triangulation(TopoDS::Face(face), location);
+            if (mesh.IsNull())
+                continue;
+            Handle(Poly_PolygonOnTriangulation) const polygon =
+                BRep_Tool::PolygonOnTriangulation(edge, mesh, location);
+            if (polygon.IsNull())
+                continue;
+            for (int node = 1; node <= polygon->NbNodes(); ++node)
+                addPoint(points, mesh->Node(polygon->Node(node)).Transformed(location));
+            return points;
+        }
+    }
+    if (!BRep_Tool::IsGeometric(edge))
+        return points;
+    BRepAdaptor_Curve const curve(edge);
+    GCPnts_TangentialDeflection const sampled(curve, options.angularDeflection,
+                                              options.linearDeflection);
+    for (int i = 1; i <= sampled.NbPoints(); ++i)
+        addPoint(points, sampled.Value(i));
+    return points;
+}
+
 int StepPartMesher::Mesh(StepPart const& part, StepReadOptions const& options,
                          TarvexAuthoredReference& reference) {
     reference.visu.unit = TarvexLengthUnit_Millimeter; // Open CASCADE gives the geometry in mm
@@ -163,7 +162,7 @@ int StepPartMesher::Mesh(StepPart const& part, StepReadOptions const& options,
             TopoDS_Edge const edge = TopoDS::Edge(part.edges(index));
             if (BRep_Tool::Degenerated(edge))
                 continue;
-            std::vector<float> points = edgePoints(edge, facesOfEdges, options);
+            std::vector<float> points = EdgePoints(edge, facesOfEdges, options);
             if (points.size() < 6)
                 continue;
             unsigned int const id = part.EdgeId(index);
@@ -177,7 +176,7 @@ int StepPartMesher::Mesh(StepPart const& part, StepReadOptions const& options,
         wires.type = TarvexVisuNode::VisuWire;
         wires.wire.geometryType = TarvexVisuGeometry_Constructed;
         for (TopExp_Explorer edge(part.supplemental, TopAbs_EDGE); edge.More(); edge.Next()) {
-            std::vector<float> points = edgePoints(TopoDS::Edge(edge.Current()), none, options);
+            std::vector<float> points = EdgePoints(TopoDS::Edge(edge.Current()), none, options);
             if (points.size() >= 6)
                 wires.wire.edges.push_back(visuEdge(std::move(points), std::nullopt));
         }

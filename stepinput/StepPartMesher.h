@@ -4,6 +4,11 @@
 #include <VizBridge/stepinput/StepPart.h>
 #include <VizBridge/stepinput/StepReadOptions.h>
 
+#include <TopTools_IndexedDataMapOfShapeListOfShape.hxx>
+#include <TopoDS_Edge.hxx>
+
+#include <vector>
+
 namespace VizBridgeStep {
 
 /// Meshes one part with Open CASCADE's BRepMesh and writes what the import library holds of
@@ -21,6 +26,14 @@ public:
     /// Gives the number of triangles made.
     static int Mesh(StepPart const& part, StepReadOptions const& options,
                     TarvexAuthoredReference& reference);
+
+    /// The points of `edge` as a polyline, three floats a point: its polygon on a meshed face
+    /// around it (from `facesOfEdges`), so that it meets that face's triangles, else its
+    /// curve sampled within the deflections. Empty for an edge without a curve.
+    static std::vector<float>
+    EdgePoints(TopoDS_Edge const& edge,
+               TopTools_IndexedDataMapOfShapeListOfShape const& facesOfEdges,
+               StepReadOptions const& options);
 };
 
 } // namespace VizBridgeStep
