@@ -28,10 +28,40 @@ bool needsItems(StepData_StepModel const& typed) {
     return false;
 }
 
+/// Drops every reference between the records of a model when it goes. A broken file can reference
+/// in a circle, and handles in a circle never free each other; each entity parameter is pointed at
+/// one shared placeholder instead (Open CASCADE refuses a null one), on every part of a
+/// complex record too. Sub-lists hang off one record each, so they go with it.
+class Unbinder {
+public:
+    explicit Unbinder(Handle(StepData_StepModel) model) : m_model(std::move(model)) {}
+    Unbinder(Unbinder const&) = delete;
+    Unbinder& operator=(Unbinder const&) = delete;
+    ~Unbinder() {
+        try {
+            Handle(Standard_Transient) const placeholder = new Standard_Transient;
+            for (int i = 1; i <= m_model->NbEntities(); ++i)
+                for (auto part = Handle(StepData_UndefinedEntity)::DownCast(m_model->Value(i));
+                     !part.IsNull(); part = part->Next()) {
+                    Handle(Interface_UndefinedContent) const content = part->UndefinedContent();
+                    for (int param = 1; !content.IsNull() && param <= content->NbParams(); ++param)
+                        if (content->IsParamEntity(param))
+                            content->SetEntity(param, placeholder);
+                }
+        } catch (...) {
+            // Whatever could not be unbound stays allocated; a destructor does not throw.
+        }
+    }
+
+private:
+    Handle(StepData_StepModel) m_model;
+};
+
 /// Reads every record of `path` as an unread entity: a protocol that knows no type leaves
 /// each record's parameters as the file gives them, references bound to entities.
 std::map<int, int> readLabels(std::string const& path) {
     Handle(StepData_StepModel) const model = new StepData_StepModel;
+    Unbinder const unbinder(model);
     std::map<int, int> labels;
     if (StepFile_Read(path.c_str(), nullptr, model, new StepData_Protocol) != 0)
         return labels;

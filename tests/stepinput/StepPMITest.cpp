@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <fstream>
 #include <map>
 #include <set>
 #include <sstream>
@@ -88,6 +90,29 @@ TEST(StepPMI, EachAnnotationIsAPMILinkedToFacesOfItsPartAndEachViewACapture) {
         EXPECT_EQ(captures.str(), c.captures);
         EXPECT_EQ(step.Counts().views, static_cast<int>(reference.visu.captures.size()));
     }
+}
+
+// One coordinate list of CTC 01 keeps a single point and then names the draughting model, so
+// that the records point in a circle: model, annotation, curve set, coordinates, model. The
+// annotation loses its lines; everything read is freed again, which the sanitized run checks.
+TEST(StepPMI, CoordinatesThatPointBackAtTheirModelLoseTheirLinesAndAreFreed) {
+    std::ifstream ctc1(StepTestFiles::Data(kCases[0].file), std::ios::binary);
+    std::string circle, line;
+    while (std::getline(ctc1, line))
+        circle += (line.rfind("#408=", 0) == 0
+                       ? "#408=COORDINATES_LIST('diameter dimension',1,((245.6,103.0,0.),#630));"
+                       : line) +
+                  "\n";
+    std::string const path = StepTestFiles::Scratch("circle.stp");
+    std::ofstream(path, std::ios::binary) << circle;
+
+    std::shared_ptr<StepDocument> const step = StepDocument::Read(path);
+    EXPECT_EQ(step->Counts().pmi, kCases[0].annotations);
+    std::vector<std::string> const& notes = step->Notes();
+    EXPECT_NE(std::find(notes.begin(), notes.end(),
+                        "annotation 'Linear Size.8' (#522): 256 indices past its coordinates are "
+                        "left out"),
+              notes.end());
 }
 
 } // namespace
