@@ -8,6 +8,8 @@
 #include <cstring>
 #include <fstream>
 #include <string_view>
+#include <unordered_set>
+#include <vector>
 
 namespace VizBridgeStep {
 
@@ -15,6 +17,7 @@ namespace {
 
 constexpr std::size_t kHeaderBytes = 64 * 1024;
 constexpr std::size_t kTrailerBytes = 4 * 1024;
+constexpr std::size_t kBlockBytes = 1024 * 1024;
 
 [[noreturn]] void fail(std::string const& path, std::string const& why) {
     throw StepReadError(path + ": " + why);
@@ -29,6 +32,76 @@ std::string squeezed(std::string_view text) {
             out += static_cast<char>(std::toupper(static_cast<unsigned char>(c)));
     return out;
 }
+
+/// Finds the first entity name ("#<digits>=" at the start of a statement) that a file gives
+/// twice, fed one character at a time so that the file is never whole in memory. Strings and
+/// comments are skipped: a ';' or a "#1=" inside them counts for nothing, and a comment
+/// separates tokens like white space.
+class NameScan {
+public:
+    /// The repeated name, once one is seen; 0 before.
+    unsigned long long Repeated() const { return m_repeated; }
+
+    void Feed(char const c) {
+        if (m_comment) {
+            m_comment = !(m_star && c == '/');
+            m_star = c == '*';
+            return;
+        }
+        if (m_string) {
+            m_string = c != '\''; // a doubled quote closes and reopens at once
+            return;
+        }
+        if (m_slash) {
+            m_slash = false;
+            if (c == '*') {
+                m_comment = true;
+                m_star = false;
+                separate();
+                return;
+            }
+            m_place = Place::Body;
+        }
+        if (c == '/')
+            m_slash = true;
+        else if (c == '\'')
+            m_string = true;
+        else if (c == ';')
+            m_place = Place::Statement;
+        else if (std::isspace(static_cast<unsigned char>(c)))
+            separate();
+        else
+            token(c);
+    }
+
+private:
+    enum class Place { Statement, Name, AfterName, Body };
+
+    void separate() {
+        if (m_place == Place::Name)
+            m_place = Place::AfterName;
+    }
+
+    void token(char const c) {
+        if (m_place == Place::Statement && c == '#') {
+            m_place = Place::Name;
+            m_name = 0;
+        } else if (m_place == Place::Name && c >= '0' && c <= '9' && m_name < (1ull << 60)) {
+            m_name = m_name * 10 + static_cast<unsigned long long>(c - '0');
+        } else if ((m_place == Place::Name || m_place == Place::AfterName) && c == '=') {
+            if (!m_names.insert(m_name).second && m_repeated == 0)
+                m_repeated = m_name;
+            m_place = Place::Body;
+        } else {
+            m_place = Place::Body;
+        }
+    }
+
+    Place m_place = Place::Statement;
+    bool m_string = false, m_comment = false, m_slash = false, m_star = false;
+    unsigned long long m_name = 0, m_repeated = 0;
+    std::unordered_set<unsigned long long> m_names;
+};
 
 } // namespace
 
@@ -66,12 +139,25 @@ std::string StepFileCheck::Check(std::string const& path) {
         fail(path, "the header names no FILE_SCHEMA");
     std::string schema = header.substr(nameStart + 1, nameEnd - nameStart - 1);
     schema = schema.substr(0, schema.find('{')); // the object identifier says nothing more
-    for (char const* known :
-         {"AP242", "AUTOMOTIVE_DESIGN", "CONFIG_CONTROL_DESIGN", "AP203", "AP214"}) {
-        if (schema.find(known) != std::string::npos)
-            return schema;
-    }
-    fail(path, "the schema " + schema + " is not one of AP203, AP214 or AP242");
+    char const* const known[] = {"AP242", "AUTOMOTIVE_DESIGN", "CONFIG_CONTROL_DESIGN", "AP203",
+                                 "AP214"};
+    if (std::none_of(std::begin(known), std::end(known),
+                     [&](char const* name) { return schema.find(name) != std::string::npos; }))
+        fail(path, "the schema " + schema + " is not one of AP203, AP214 or AP242");
+
+    // Open CASCADE's reader can crash on a name given twice, which the standard forbids.
+    NameScan names;
+    std::vector<char> block(kBlockBytes);
+    file.clear();
+    file.seekg(0);
+    while (
+        names.Repeated() == 0 &&
+        (file.read(block.data(), static_cast<std::streamsize>(block.size())) || file.gcount() > 0))
+        for (std::streamsize i = 0; i < file.gcount(); ++i)
+            names.Feed(block[static_cast<std::size_t>(i)]);
+    if (names.Repeated() != 0)
+        fail(path, "the entity name #" + std::to_string(names.Repeated()) + " is given twice");
+    return schema;
 }
 
 } // namespace VizBridgeStep

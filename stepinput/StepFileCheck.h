@@ -12,7 +12,8 @@ public:
 
     /// Throws StepReadError unless `path` names a readable, non-empty exchange-structure file
     /// ("ISO-10303-21;" first) that ends with "END-ISO-10303-21;" and whose schema is one the
-    /// reader knows (AP203, AP214 or AP242). Gives the schema's name.
+    /// reader knows (AP203, AP214 or AP242), and that gives no entity name twice. Gives the
+    /// schema's name.
     static std::string Check(std::string const& path);
 };
 

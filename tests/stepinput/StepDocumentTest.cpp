@@ -159,6 +159,9 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
     std::size_t const comma = broken.find(',', lineAt);
     broken.replace(lineAt, comma - lineAt,
                    broken.substr(comma + 2, broken.find(')', comma) - comma - 2));
+    // A name given twice, after names inside a comment and a string that count for nothing.
+    std::string twice = valid;
+    twice.insert(twice.rfind("ENDSEC;"), "/* #2=X(); */ #4=X(';#3=X();'); #3=X(); #4=X();\n");
     std::string wrongSchema = valid;
     std::size_t const schemaAt = wrongSchema.find("FILE_SCHEMA");
     wrongSchema.replace(schemaAt, wrongSchema.find(';', schemaAt) - schemaAt,
@@ -187,6 +190,7 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
         {"broken.stp", broken,
          "its geometry is broken at #27 (Parameter n0.2 (pnt) : Entity has illegal type)"},
         {"nothing.stp", StepTestFiles::EmptyDataFile(), "the file holds no entity"},
+        {"twice.stp", twice, "the entity name #4 is given twice"},
     };
     for (BadCase const& c : cases) {
         SCOPED_TRACE(c.name);
