@@ -1,6 +1,7 @@
 #include <VizBridge/stepinput/StepFileCheck.h>
 
 #include <VizBridge/stepinput/StepReadError.h>
+#include <VizBridge/stepinput/StepRecordScan.h>
 
 #include <algorithm>
 #include <cctype>
@@ -8,7 +9,6 @@
 #include <cstring>
 #include <fstream>
 #include <string_view>
-#include <unordered_set>
 #include <vector>
 
 namespace VizBridgeStep {
@@ -32,76 +32,6 @@ std::string squeezed(std::string_view text) {
             out += static_cast<char>(std::toupper(static_cast<unsigned char>(c)));
     return out;
 }
-
-/// Finds the first entity name ("#<digits>=" at the start of a statement) that a file gives
-/// twice, fed one character at a time so that the file is never whole in memory. Strings and
-/// comments are skipped: a ';' or a "#1=" inside them counts for nothing, and a comment
-/// separates tokens like white space.
-class NameScan {
-public:
-    /// The repeated name, once one is seen; 0 before.
-    unsigned long long Repeated() const { return m_repeated; }
-
-    void Feed(char const c) {
-        if (m_comment) {
-            m_comment = !(m_star && c == '/');
-            m_star = c == '*';
-            return;
-        }
-        if (m_string) {
-            m_string = c != '\''; // a doubled quote closes and reopens at once
-            return;
-        }
-        if (m_slash) {
-            m_slash = false;
-            if (c == '*') {
-                m_comment = true;
-                m_star = false;
-                separate();
-                return;
-            }
-            m_place = Place::Body;
-        }
-        if (c == '/')
-            m_slash = true;
-        else if (c == '\'')
-            m_string = true;
-        else if (c == ';')
-            m_place = Place::Statement;
-        else if (std::isspace(static_cast<unsigned char>(c)))
-            separate();
-        else
-            token(c);
-    }
-
-private:
-    enum class Place { Statement, Name, AfterName, Body };
-
-    void separate() {
-        if (m_place == Place::Name)
-            m_place = Place::AfterName;
-    }
-
-    void token(char const c) {
-        if (m_place == Place::Statement && c == '#') {
-            m_place = Place::Name;
-            m_name = 0;
-        } else if (m_place == Place::Name && c >= '0' && c <= '9' && m_name < (1ull << 60)) {
-            m_name = m_name * 10 + static_cast<unsigned long long>(c - '0');
-        } else if ((m_place == Place::Name || m_place == Place::AfterName) && c == '=') {
-            if (!m_names.insert(m_name).second && m_repeated == 0)
-                m_repeated = m_name;
-            m_place = Place::Body;
-        } else {
-            m_place = Place::Body;
-        }
-    }
-
-    Place m_place = Place::Statement;
-    bool m_string = false, m_comment = false, m_slash = false, m_star = false;
-    unsigned long long m_name = 0, m_repeated = 0;
-    std::unordered_set<unsigned long long> m_names;
-};
 
 } // namespace
 
@@ -145,18 +75,18 @@ std::string StepFileCheck::Check(std::string const& path) {
                      [&](char const* name) { return schema.find(name) != std::string::npos; }))
         fail(path, "the schema " + schema + " is not one of AP203, AP214 or AP242");
 
-    // Open CASCADE's reader can crash on a name given twice, which the standard forbids.
-    NameScan names;
+    // Open CASCADE's reader can crash on a name given twice and leak on a record without one.
+    StepRecordScan records;
     std::vector<char> block(kBlockBytes);
     file.clear();
     file.seekg(0);
     while (
-        names.Repeated() == 0 &&
+        records.Fault().empty() &&
         (file.read(block.data(), static_cast<std::streamsize>(block.size())) || file.gcount() > 0))
         for (std::streamsize i = 0; i < file.gcount(); ++i)
-            names.Feed(block[static_cast<std::size_t>(i)]);
-    if (names.Repeated() != 0)
-        fail(path, "the entity name #" + std::to_string(names.Repeated()) + " is given twice");
+            records.Feed(block[static_cast<std::size_t>(i)]);
+    if (!records.Fault().empty())
+        fail(path, records.Fault());
     return schema;
 }
 

@@ -5,7 +5,8 @@
 namespace VizBridgeStep {
 
 /// A STEP file that cannot be read: missing, unreadable, empty, truncated, no STEP file, a
-/// schema the reader does not know, or no shape in it. what() is one line that names the
+/// schema the reader does not know, records without a name or with one name twice, broken
+/// geometry, or no shape in it. what() is one line that names the
 /// file and says what is wrong with it.
 class StepReadError : public std::runtime_error {
 public:

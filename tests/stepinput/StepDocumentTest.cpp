@@ -16,6 +16,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <fstream>
 
 namespace VizBridgeStep {
@@ -133,7 +134,7 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
     struct BadCase {
         char const* name;
         std::string content; ///< of the file; "missing.stp" is not made
-        char const* error;   ///< after "<path>: "
+        std::string error;   ///< after "<path>: "
     };
     std::string const valid = StepTestFiles::BoxFile();
     // The solid's shell goes, while the solid still points at it.
@@ -160,8 +161,13 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
     broken.replace(lineAt, comma - lineAt,
                    broken.substr(comma + 2, broken.find(')', comma) - comma - 2));
     // A name given twice, after names inside a comment and a string that count for nothing.
+    std::size_t const dataEnd = valid.rfind("ENDSEC;");
+    std::string const dataEndLine =
+        std::to_string(std::count(valid.begin(), valid.begin() + dataEnd, '\n') + 1);
     std::string twice = valid;
-    twice.insert(twice.rfind("ENDSEC;"), "/* #2=X(); */ #4=X(';#3=X();'); #3=X(); #4=X();\n");
+    twice.insert(dataEnd, "/* #90003=X(); */ #90004=X(';#90003=X();'); #90003=X(); #90004=X();\n");
+    std::string nameless = valid;
+    nameless.insert(dataEnd, "#90004=X(); X(#90004);\n");
     std::string wrongSchema = valid;
     std::size_t const schemaAt = wrongSchema.find("FILE_SCHEMA");
     wrongSchema.replace(schemaAt, wrongSchema.find(';', schemaAt) - schemaAt,
@@ -190,7 +196,9 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
         {"broken.stp", broken,
          "its geometry is broken at #27 (Parameter n0.2 (pnt) : Entity has illegal type)"},
         {"nothing.stp", StepTestFiles::EmptyDataFile(), "the file holds no entity"},
-        {"twice.stp", twice, "the entity name #4 is given twice"},
+        {"twice.stp", twice, "the entity name #90004 is given twice (line " + dataEndLine + ")"},
+        {"nameless.stp", nameless,
+         "a record does not begin with an entity name #<number>= (line " + dataEndLine + ")"},
     };
     for (BadCase const& c : cases) {
         SCOPED_TRACE(c.name);
