@@ -85,6 +85,7 @@ std::string StepFileCheck::Check(std::string const& path) {
         (file.read(block.data(), static_cast<std::streamsize>(block.size())) || file.gcount() > 0))
         for (std::streamsize i = 0; i < file.gcount(); ++i)
             records.Feed(block[static_cast<std::size_t>(i)]);
+    records.Finish();
     if (!records.Fault().empty())
         fail(path, records.Fault());
     return schema;

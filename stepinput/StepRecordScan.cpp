@@ -1,6 +1,7 @@
 #include <VizBridge/stepinput/StepRecordScan.h>
 
 #include <cctype>
+#include <utility>
 
 namespace VizBridgeStep {
 
@@ -21,6 +22,7 @@ void StepRecordScan::Feed(char const c) {
         if (c == '*') {
             m_comment = true;
             m_star = false;
+            m_openLine = m_line;
             separate();
             return;
         }
@@ -72,23 +74,24 @@ void StepRecordScan::token(char const c) {
     case Place::AfterName:
         if (c == '=' && m_digits) {
             m_named = true;
-            if (!m_names.insert(m_name).second && m_fault.empty())
-                m_fault = "the entity name #" + std::to_string(m_name) + " is given twice (line " +
-                          std::to_string(m_statementLine) + ")";
+            if (!m_names.insert(m_name).second)
+                fault("the entity name #" + std::to_string(m_name) + " is given twice",
+                      m_statementLine);
         }
         m_place = Place::Body;
         break;
     case Place::Body:
         break;
     }
-    if (c == '\'')
+    if (c == '\'') {
         m_string = true;
+        m_openLine = m_line;
+    }
 }
 
 void StepRecordScan::endStatement() {
-    if (m_inData && !m_named && m_keyword != "ENDSEC" && m_fault.empty())
-        m_fault = "a record does not begin with an entity name #<number>= (line " +
-                  std::to_string(m_statementLine) + ")";
+    if (m_inData && !m_named && m_keyword != "ENDSEC")
+        fault("a record does not begin with an entity name #<number>=", m_statementLine);
     if (m_keyword == "DATA")
         m_inData = true;
     else if (m_keyword == "ENDSEC")
@@ -96,6 +99,20 @@ void StepRecordScan::endStatement() {
     m_place = Place::Statement;
     m_named = false;
     m_keyword.clear();
+}
+
+void StepRecordScan::Finish() {
+    if (m_string)
+        fault("a string is never closed", m_openLine);
+    else if (m_comment)
+        fault("a comment is never closed", m_openLine);
+    else if (m_inData)
+        fault("a data section is never closed", m_line);
+}
+
+void StepRecordScan::fault(std::string what, long long const line) {
+    if (m_fault.empty())
+        m_fault = std::move(what) + " (line " + std::to_string(line) + ")";
 }
 
 } // namespace VizBridgeStep

@@ -14,6 +14,10 @@ class StepRecordScan {
 public:
     void Feed(char c);
 
+    /// Says that the file ends here: a string, a comment or a data section still open is a
+    /// fault too.
+    void Finish();
+
     /// The first fault in file order, as "<what> (line <n>)"; empty while there is none.
     std::string const& Fault() const { return m_fault; }
 
@@ -23,6 +27,7 @@ private:
     void separate();
     void token(char c);
     void endStatement();
+    void fault(std::string what, long long line);
 
     Place m_place = Place::Statement;
     bool m_string = false, m_comment = false, m_slash = false, m_star = false;
@@ -32,6 +37,7 @@ private:
     std::string m_keyword; ///< of a statement that does not begin with '#'
     unsigned long long m_name = 0;
     long long m_line = 1, m_statementLine = 1;
+    long long m_openLine = 1; ///< where the string or comment began
     std::unordered_set<unsigned long long> m_names;
     std::string m_fault;
 };

@@ -168,6 +168,8 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
     twice.insert(dataEnd, "/* #90003=X(); */ #90004=X(';#90003=X();'); #90003=X(); #90004=X();\n");
     std::string nameless = valid;
     nameless.insert(dataEnd, "#90004=X(); X(#90004);\n");
+    std::string openString = valid;
+    openString.insert(dataEnd, "#90004=X('the rest of the file);\n");
     std::string wrongSchema = valid;
     std::size_t const schemaAt = wrongSchema.find("FILE_SCHEMA");
     wrongSchema.replace(schemaAt, wrongSchema.find(';', schemaAt) - schemaAt,
@@ -199,6 +201,7 @@ TEST(StepDocument, RefusesFilesThatAreNotWhatTheyClaimWithOneLine) {
         {"twice.stp", twice, "the entity name #90004 is given twice (line " + dataEndLine + ")"},
         {"nameless.stp", nameless,
          "a record does not begin with an entity name #<number>= (line " + dataEndLine + ")"},
+        {"open-string.stp", openString, "a string is never closed (line " + dataEndLine + ")"},
     };
     for (BadCase const& c : cases) {
         SCOPED_TRACE(c.name);
