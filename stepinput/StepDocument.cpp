@@ -20,6 +20,8 @@
 #include <STEPCAFControl_Reader.hxx>
 #include <Standard_Failure.hxx>
 #include <StepData_StepModel.hxx>
+#include <StepVisual_FillAreaStyle.hxx>
+#include <StepVisual_SurfaceStyleUsage.hxx>
 #include <TColStd_SequenceOfAsciiString.hxx>
 #include <TDocStd_Document.hxx>
 #include <XSControl_WorkSession.hxx>
@@ -84,6 +86,13 @@ std::optional<VizPort::WString> joined(Handle(Interface_HArray1OfHAsciiString) c
 bool isShapeEntity(Standard_Transient const& entity) {
     std::string_view const type = entity.DynamicType()->Name();
     return type.rfind("StepGeom_", 0) == 0 || type.rfind("StepShape_", 0) == 0;
+}
+
+/// The style entities that Open CASCADE's colour reading follows without looking for a field
+/// that could not be read.
+bool isColourStyleEntity(Standard_Transient const& entity) {
+    return entity.IsKind(STANDARD_TYPE(StepVisual_SurfaceStyleUsage)) ||
+           entity.IsKind(STANDARD_TYPE(StepVisual_FillAreaStyle));
 }
 
 struct UnitName {
@@ -157,6 +166,7 @@ void StepDocument::readLocked(std::string const& path, StepReadOptions const& op
     // parameter) are left out of the transfer: say so, and the first few.
     Interface_CheckIterator const checks = reader.ChangeReader().WS()->ModelCheckList();
     int failed = 0;
+    std::string brokenStyle;
     for (checks.Start(); checks.More(); checks.Next()) {
         Handle(Interface_Check) const& check = checks.Value();
         if (!check->HasFailed())
@@ -167,6 +177,10 @@ void StepDocument::readLocked(std::string const& path, StepReadOptions const& op
             throw StepReadError(path + ": its geometry is broken at #" +
                                 std::to_string(model->IdentLabel(check->Entity())) + " (" +
                                 check->CFail(1) + ")");
+        // Likewise its colour reading with styles: the file is read without colours.
+        if (brokenStyle.empty() && !check->Entity().IsNull() &&
+            isColourStyleEntity(*check->Entity()))
+            brokenStyle = "#" + std::to_string(model->IdentLabel(check->Entity()));
         if (++failed > kReportedChecks)
             continue;
         std::string const where = check->Entity().IsNull()
@@ -177,6 +191,10 @@ void StepDocument::readLocked(std::string const& path, StepReadOptions const& op
     if (failed > kReportedChecks)
         m_notes.push_back(std::to_string(failed - kReportedChecks) +
                           " more entities could not be read");
+    if (!brokenStyle.empty()) {
+        reader.SetColorMode(false);
+        m_notes.push_back("colours are not read: the style " + brokenStyle + " is broken");
+    }
     if (!reader.Transfer(xcaf))
         throw StepReadError(path + ": no shape could be transferred from the file");
 

@@ -81,6 +81,26 @@ TEST(StepDocument, ReadsWhatACarefulReaderFindsInTheCTCModels) {
     }
 }
 
+// A surface style of CTC 01 names a triangulated set for its side style. Open CASCADE's colour
+// reading would follow it unchecked; the file is read without colours instead, and says so.
+TEST(StepDocument, ABrokenSurfaceStyleLeavesTheColoursOutAndSaysSo) {
+    std::ifstream ctc1(StepTestFiles::Data(kModels[0].file), std::ios::binary);
+    std::string text, line;
+    while (std::getline(ctc1, line))
+        text += (line.rfind("#3455=", 0) == 0 ? "#3455=SURFACE_STYLE_USAGE(.BOTH.,#345);" : line) +
+                "\n";
+    std::string const path = StepTestFiles::Scratch("style.stp");
+    std::ofstream(path, std::ios::binary) << text;
+
+    std::shared_ptr<StepDocument> const step = StepDocument::Read(path);
+    EXPECT_EQ(bytes(step->Parts().front().color), "none");
+    EXPECT_EQ(step->Counts().faces, kModels[0].faces);
+    std::vector<std::string> const& notes = step->Notes();
+    EXPECT_NE(
+        std::find(notes.begin(), notes.end(), "colours are not read: the style #3455 is broken"),
+        notes.end());
+}
+
 TEST(StepDocument, AnAssemblyWrittenFromThePartsImportsEachPartOnceAndComposesPlacements) {
     StepDocument const& step = StepTestFiles::Assembly();
     EXPECT_EQ(step.Counts().parts, 2);
