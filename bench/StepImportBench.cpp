@@ -57,6 +57,7 @@ void BM_OpenCascadeAlone(benchmark::State& state) {
         reader.SetLayerMode(true);
         reader.SetGDTMode(true);
         reader.SetViewMode(true);
+        reader.SetPropsMode(false); // as VizBridge reads
         if (reader.ReadFile(kFile.c_str()) != IFSelect_RetDone || !reader.Transfer(document))
             throw std::runtime_error("Open CASCADE could not read " + kFile);
         TDF_LabelSequence shapes;

@@ -88,6 +88,14 @@ bool isShapeEntity(Standard_Transient const& entity) {
     return type.rfind("StepGeom_", 0) == 0 || type.rfind("StepShape_", 0) == 0;
 }
 
+/// "#<label>" of an entity of `model`. Appended, not added: GCC 12 warns wrongly about
+/// `"#" + std::string` in optimised builds.
+std::string labelOf(StepData_StepModel const& model, Handle(Standard_Transient) const& entity) {
+    std::string label = "#";
+    label += std::to_string(model.IdentLabel(entity));
+    return label;
+}
+
 /// The style entities that Open CASCADE's colour reading follows without looking for a field
 /// that could not be read.
 bool isColourStyleEntity(Standard_Transient const& entity) {
@@ -174,18 +182,16 @@ void StepDocument::readLocked(std::string const& path, StepReadOptions const& op
         // Open CASCADE's shape transfer follows the fields of geometry and topology entities
         // unchecked: one that could not be read crashes it. Such a file is refused.
         if (!check->Entity().IsNull() && isShapeEntity(*check->Entity()))
-            throw StepReadError(path + ": its geometry is broken at #" +
-                                std::to_string(model->IdentLabel(check->Entity())) + " (" +
-                                check->CFail(1) + ")");
+            throw StepReadError(path + ": its geometry is broken at " +
+                                labelOf(*model, check->Entity()) + " (" + check->CFail(1) + ")");
         // Likewise its colour reading with styles: the file is read without colours.
         if (brokenStyle.empty() && !check->Entity().IsNull() &&
             isColourStyleEntity(*check->Entity()))
-            brokenStyle = "#" + std::to_string(model->IdentLabel(check->Entity()));
+            brokenStyle = labelOf(*model, check->Entity());
         if (++failed > kReportedChecks)
             continue;
-        std::string const where = check->Entity().IsNull()
-                                      ? std::string("the file")
-                                      : "#" + std::to_string(model->IdentLabel(check->Entity()));
+        std::string const where =
+            check->Entity().IsNull() ? std::string("the file") : labelOf(*model, check->Entity());
         m_notes.push_back(where + ": " + check->CFail(1));
     }
     if (failed > kReportedChecks)
