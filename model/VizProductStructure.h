@@ -8,6 +8,13 @@
 #include <memory>
 #include <vector>
 
+namespace KolbaVizCore {
+class AView3DAdapter;
+class VizCapture;
+class VizView;
+struct Ray;
+} // namespace KolbaVizCore
+
 namespace VizBridgeTarvex {
 
 class VizBuilder;
@@ -99,6 +106,22 @@ public:
     /// not in the map changes nothing.
     void RemoveVizPartContainer(VizPartContainer* container);
     void RemoveVizPMIContainer(VizPMIContainer* container);
+
+    // After a render, without the renderer.
+    /// What lies under `ray`: in `element` the element hit, asked of the PMI containers
+    /// first and of the tessellated containers only if no PMI was hit; in `entry` the
+    /// deepest entry whose render id begins the path the view picked (of two as deep, the
+    /// first in tree order). Either stays as it was when nothing is found; the caller sets
+    /// both to null before. True if either was found; false for a null view.
+    bool PickVisual(KolbaVizCore::AView3DAdapter* view, KolbaVizCore::Ray const& ray,
+                    VizElement*& element, VizPSEntry*& entry) const;
+    /// Makes `capture` active or not, switches every other view and capture of the
+    /// containers off, and shows the PMI that the active capture holds in its own container.
+    /// If nothing at all was active before, every PMI is shown; if something was but nothing
+    /// is now, every PMI stays hidden. `capture` need not stand in a container. Always true.
+    bool SetActive(KolbaVizCore::VizCapture& capture, bool const& active);
+    /// The same for a view: the PMI that the active view holds are shown.
+    bool SetActive(KolbaVizCore::VizView& view, bool const& active);
 
     /// "Product: " and the product name, then the tree, one line per entry.
     WString ToString() const;

@@ -19,6 +19,7 @@
 #include <VizBridge/contracts/platform/FormatW.h>
 #include <VizBridge/services/UniqueServices.h>
 
+#include <cmath>
 #include <cstdint>
 #include <new>
 
@@ -69,6 +70,21 @@ void AVizRenderer::GetGeometryCenter(float* const center) const {
 
 float AVizRenderer::GetGeometryRadius() const {
     return m_geometryRadius;
+}
+
+bool AVizRenderer::updateExtentsFromBox() {
+    if (m_geometryBox.IsEmpty())
+        return false;
+    double center[3];
+    m_geometryBox.GetCenter(center);
+    double const* const high = m_geometryBox.GetHigh();
+    double squared = 0.0;
+    for (int axis = 0; axis < 3; ++axis) {
+        m_geometryCenter[axis] = static_cast<float>(center[axis]);
+        squared += (high[axis] - center[axis]) * (high[axis] - center[axis]);
+    }
+    m_geometryRadius = static_cast<float>(std::sqrt(squared)) / 2.0f;
+    return true;
 }
 
 void AVizRenderer::GetGeometryBox(float* const box) const {

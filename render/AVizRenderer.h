@@ -47,6 +47,9 @@ protected:
     AVizRenderer(AVizRenderer const& other);
     AVizRenderer& operator=(AVizRenderer const& other);
 
+    /// Centre and radius (a quarter of the diagonal, as viewers of these scenes expect it)
+    /// from the box; false, and both untouched, when the box is empty.
+    bool updateExtentsFromBox();
     /// Forgets the box; centre, radius and the tag counter stay.
     void clearBase();
     /// Tags count from 0 in the order items are built and are never reused.

@@ -86,17 +86,7 @@ bool TarvexRenderer::Render() {
                                   << std::endl;
             reportProgress(0, total, "RenderInit");
             result = renderRootInstances();
-            if (result && !m_geometryBox.IsEmpty()) {
-                double center[3];
-                m_geometryBox.GetCenter(center);
-                double const* const high = m_geometryBox.GetHigh();
-                double squared = 0.0;
-                for (int axis = 0; axis < 3; ++axis) {
-                    m_geometryCenter[axis] = static_cast<float>(center[axis]);
-                    squared += (high[axis] - center[axis]) * (high[axis] - center[axis]);
-                }
-                // A quarter of the diagonal, as viewers of these scenes expect it.
-                m_geometryRadius = static_cast<float>(std::sqrt(squared)) / 2.0f;
+            if (result && updateExtentsFromBox()) {
                 if (auto* const adapter = getView3DAdapter()) {
                     if (auto* const view = adapter->GetView3D())
                         view->SetGeometryExtents(m_geometryCenter, m_geometryRadius);
@@ -169,6 +159,8 @@ void TarvexRenderer::cleanPSData() {
         }
     }
     m_brepRenderers.clear();
+    m_pmiRenderers.clear(); // their "PMI" nodes go with the product node
+    m_pmiRenderMap.clear();
     if (auto* const builder = getSceneBuilder())
         builder->RemoveNode(m_productRenderId);
     m_productRenderId.Clear();

@@ -2,6 +2,7 @@
 
 #include <VizBridge/contracts/platform/RecursiveLock.h>
 #include <VizBridge/render/AVizRenderer.h>
+#include <VizBridge/render/PmiRenderer.h>
 #include <VizBridge/render/RenderedGeometry.h>
 
 #include <cstdint>
@@ -17,13 +18,13 @@ class VizPSEntry;
 ///
 /// The scene: "ROOT", the product node, one node per instance with its placement, override
 /// colour and visibility; below the first instance of a reference what the reference holds
-/// (the modeler's BREP, or the tessellated geometry), and below every further instance a
-/// node reference to that drawing.
+/// (the modeler's BREP, or the tessellated geometry, and its PMI), and below every further
+/// instance a node reference to that drawing.
 ///
 /// Points at the product structure and the SceneBuilder, which the host keeps alive until
-/// the renderer is deleted; owns the sub-renderers the modeler services made for it and
-/// its own clone of the services. Deleting a rendered renderer removes its nodes from the
-/// scene.
+/// the renderer is deleted; owns the sub-renderers the modeler services made for it, the PMI
+/// renderers it made, and its own clone of the services. Deleting a rendered renderer removes its
+/// nodes from the scene.
 class TarvexRenderer : public AVizRenderer {
 public:
     /// A new renderer, owned by the caller; null for a null structure, which cannot be
@@ -78,7 +79,6 @@ protected:
     // One reference's content, drawn once and referenced by further instances.
     bool renderPartBREP(int const& id, VizTransf const& transformation, VizBox& box);
     bool renderPartGeometry(int const& id, VizTransf const& transformation, VizBox& box);
-    /// Not built yet: draws nothing until the PMI renderer exists.
     bool renderPartPMI(int const& id, VizTransf const& transformation, VizBox& box);
     RenderId renderGeom(VizContainer const& container, VizBox& box);
 
@@ -90,6 +90,10 @@ protected:
     std::map<int, RenderedGeometry> const& geometryRenderMap() const { return m_geometryRenderMap; }
     std::map<int, std::unique_ptr<KolbaVizCore::ARenderer>>& brepRenderers() {
         return m_brepRenderers;
+    }
+    std::map<int, RenderedGeometry> const& pmiRenderMap() const { return m_pmiRenderMap; }
+    std::map<int, std::unique_ptr<PmiRenderer>> const& pmiRenderers() const {
+        return m_pmiRenderers;
     }
 
 private:
@@ -110,6 +114,9 @@ private:
     /// Per reference id, the renderer the modeler services made; a value may be null.
     std::map<int, std::unique_ptr<KolbaVizCore::ARenderer>> m_brepRenderers;
     std::map<int, RenderedGeometry> m_geometryRenderMap;
+    std::map<int, RenderedGeometry> m_pmiRenderMap;
+    /// Per reference id, the renderer of its PMI container, made on its first instance.
+    std::map<int, std::unique_ptr<PmiRenderer>> m_pmiRenderers;
     std::map<EntityId, RenderId> m_linkMap;
     int m_level = 0;
     bool m_colorOverride = false;

@@ -10,13 +10,14 @@
 #include <VizBridge/contracts/kolba/SceneContext.h>
 #include <VizBridge/contracts/kolba/SceneLevelContext.h>
 #include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
 #include <VizBridge/contracts/kolba/VizPointSet.h>
 #include <VizBridge/contracts/kolba/VizWire.h>
 #include <VizBridge/contracts/platform/FormatW.h>
 #include <VizBridge/model/BoxTransform.h>
 #include <VizBridge/model/VizPSEntry.h>
 #include <VizBridge/model/VizProductStructure.h>
-#include <VizBridge/render/SameRenderId.h>
+#include <VizBridge/model/SameRenderId.h>
 #include <VizBridge/services/UniqueServices.h>
 #include <VizBridge/services/VizModelerServices.h>
 
@@ -294,9 +295,50 @@ bool TarvexRenderer::renderPartGeometry(int const& id, VizTransf const& transfor
     return true;
 }
 
-bool TarvexRenderer::renderPartPMI(int const&, VizTransf const&, VizBox&) {
-    // Not built yet: the PMI renderer is still to come, so a reference's PMI container shows
-    // nothing and adds nothing to the box.
+bool TarvexRenderer::renderPartPMI(int const& id, VizTransf const& transformation, VizBox& box) {
+    SceneBuilder* const builder = getSceneBuilder();
+    VizBox local;
+    if (auto const recorded = m_pmiRenderMap.find(id); recorded != m_pmiRenderMap.end()) {
+        local = recorded->second.box;
+        bool referenced = false;
+        if (referenceRecorded(recorded->second.path, referenced) && referenced) {
+            // The instance node is another node the PMI renderer's drawing shows under.
+            RenderId current;
+            auto const renderer = m_pmiRenderers.find(id);
+            if (renderer != m_pmiRenderers.end() && renderer->second &&
+                builder->GetCurrentRenderId(current) && !current.IsEmpty())
+                renderer->second->AddOwnerReference(current[current.Length() - 1]);
+        }
+    } else if (KolbaVizCore::VizPMIContainer* const container =
+                   m_productStructure->GetVizPMIContainer(id)) {
+        std::unique_ptr<PmiRenderer>& renderer = m_pmiRenderers[id];
+        if (!renderer) {
+            // The part's modeler renderer, if one was made, converts the PMI's links; a
+            // reference without one gains a null entry here.
+            KolbaVizCore::ARenderer* const owner = m_brepRenderers[id].get();
+            renderer =
+                std::make_unique<PmiRenderer>(container, owner, builder, rendererServices(), false);
+            renderer->SetBuilderOwnership(false);
+        }
+        if (renderer->Render()) {
+            RenderId const path = renderer->GetRenderId();
+            float corners[6];
+            renderer->GetGeometryBox(corners);
+            float sum = 0.0f;
+            for (float const corner : corners)
+                sum += corner;
+            if (sum != 0.0f) {
+                double const low[3] = {corners[0], corners[1], corners[2]};
+                double const high[3] = {corners[3], corners[4], corners[5]};
+                local.Add(low);
+                local.Add(high);
+            }
+            // PMI that fills no box is drawn again by the next instance.
+            if (!path.IsEmpty() && !local.IsEmpty())
+                m_pmiRenderMap[id] = RenderedGeometry{path, local};
+        }
+    }
+    finishBox(transformation, local, box);
     return true;
 }
 

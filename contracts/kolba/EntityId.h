@@ -29,6 +29,35 @@ public:
         return m_type == PMI || (m_type >= UnknownPMI && m_type <= Roughness);
     }
 
+    /// The kind a number names: a named EntityType value is itself; any other number, which
+    /// can only come from a group tag of PMI that the library does not know, is UnknownPMI.
+    static EntityType GetTypeFromInt(std::uint32_t value) {
+        switch (value) {
+        case Vertex:
+        case Edge:
+        case Face:
+        case Body:
+        case Cloud:
+        case PMI:
+        case Vis:
+        case Group:
+        case Link:
+        case Text:
+        case Views:
+        case Captures:
+        case UnknownPMI:
+        case Note:
+        case Datum:
+        case Dimension:
+        case GeomTol:
+        case Roughness:
+        case FTAGeometry:
+            return static_cast<EntityType>(value);
+        default:
+            return UnknownPMI;
+        }
+    }
+
     /// Orders by id, then parent id, then type.
     bool operator<(EntityId const& other) const {
         return std::tie(m_id, m_parentId, m_type) <

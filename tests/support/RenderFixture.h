@@ -182,6 +182,9 @@ public:
     using TarvexRenderer::renderVizWire;
 
     std::size_t brepRendererCount() { return brepRenderers().size(); }
+    using TarvexRenderer::brepRenderers;
+    using TarvexRenderer::pmiRenderers;
+    using TarvexRenderer::pmiRenderMap;
 };
 
 } // namespace VizBridgeTarvex

@@ -1,0 +1,396 @@
+#include <VizBridge/render/PmiRenderer.h>
+
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/AView3DAdapter.h>
+#include <VizBridge/contracts/kolba/BodyContext.h>
+#include <VizBridge/contracts/kolba/EntityContext.h>
+#include <VizBridge/contracts/kolba/EntityTypeContext.h>
+#include <VizBridge/contracts/kolba/IView3D.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/SceneLevelContext.h>
+#include <VizBridge/contracts/kolba/VizCapture.h>
+#include <VizBridge/contracts/kolba/VizEdge.h>
+#include <VizBridge/contracts/kolba/VizFace.h>
+#include <VizBridge/contracts/kolba/VizMesh.h>
+#include <VizBridge/contracts/kolba/VizPMI.h>
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
+#include <VizBridge/contracts/kolba/VizPointSet.h>
+#include <VizBridge/contracts/kolba/VizText.h>
+#include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/contracts/kolba/VizWire.h>
+
+#include <algorithm>
+#include <cmath>
+
+namespace VizBridgeTarvex {
+
+using KolbaVizCore::EntityType;
+using KolbaVizCore::SceneBuilder;
+using KolbaVizCore::SceneLevelContext;
+
+namespace {
+
+constexpr unsigned long kNoOwner = 0xFFFFFFFFu;
+/// The viewer option that FTA meshes ask for; what it does is the viewer's affair.
+constexpr int kFTAMeshViewOption = 1;
+/// FTA meshes are drawn half transparent.
+constexpr int kFTAMeshAlpha = 128;
+constexpr unsigned int kPlaneRectangleFloats = 15;
+
+WString widened(std::string const& narrow) {
+    return WString(narrow.begin(), narrow.end());
+}
+
+bool isTopTag(std::uint32_t tag) {
+    return tag == KolbaVizCore::PMI || tag == KolbaVizCore::Views || tag == KolbaVizCore::Captures;
+}
+
+EntityType typeFromTag(std::uint32_t tag) {
+    return KolbaVizCore::EntityId::GetTypeFromInt(tag);
+}
+
+} // namespace
+
+PmiRenderer::PmiRenderer(KolbaVizCore::VizPMIContainer* container, KolbaVizCore::ARenderer* owner,
+                         SceneBuilder* builder, VizModelerServices* services,
+                         bool const& ownerPathsComplete)
+    : AVizRenderer(builder, services), m_pmiContainer(container), m_ownerRenderer(owner),
+      m_ownerPathsComplete(ownerPathsComplete) {}
+
+PmiRenderer::~PmiRenderer() {
+    m_pmiContainer = nullptr;
+}
+
+void PmiRenderer::AddOwnerReference(unsigned long const& tag) {
+    m_ownerReferences.push_back(static_cast<std::uint32_t>(tag));
+}
+
+bool PmiRenderer::Render() {
+    if (!preRender())
+        return false;
+    setRenderId(renderPMI());
+    m_viewsRenderId = renderViews();
+    m_capturesRenderId = renderCaptures();
+    postRender();
+    return true;
+}
+
+void PmiRenderer::ClearAll() {
+    forgetDrawing();
+    clearBase();
+}
+
+bool PmiRenderer::preRender() {
+    forgetDrawing();
+    m_geometryBox = VizBox();
+    return true;
+}
+
+void PmiRenderer::forgetDrawing() {
+    for (RenderId* const drawn : {&m_capturesRenderId, &m_viewsRenderId}) {
+        if (drawn->IsEmpty())
+            continue;
+        if (SceneBuilder* const builder = getSceneBuilder())
+            builder->RemoveNode(*drawn);
+        drawn->Clear();
+    }
+    m_pmiElements.clear();
+    m_viewElements.clear();
+    m_captureElements.clear();
+    m_ownerReferences.clear();
+}
+
+void PmiRenderer::postRender() {
+    updateExtentsFromBox();
+}
+
+RenderId PmiRenderer::renderPMI() {
+    SceneBuilder* const builder = getSceneBuilder();
+    if (!m_pmiContainer || !builder)
+        return RenderId();
+    KolbaVizCore::EntityTypeContext const top(builder, KolbaVizCore::PMI, u"PMI");
+    if (!top.IsOK())
+        return RenderId();
+    RenderId path;
+    if (builder->GetCurrentRenderId(path) && path.Length() > 1)
+        AddOwnerReference(path[path.Length() - 2]); // the node the drawing shows under
+
+    double const scale = m_pmiContainer->GetScaleFactor();
+    bool scaled = false;
+    VizTransf transformation;
+    if (scale != 1.0 && std::fabs(scale) > 1e-5) {
+        transformation = VizTransf(scale);
+        scaled = true;
+    }
+
+    for (KolbaVizCore::VizPMI* const pmi : m_pmiContainer->GetVizPMIs()) {
+        if (!pmi)
+            continue;
+        KolbaVizCore::VizPMIType const group = pmi->GetGroupType();
+        EntityType const groupType = group.GetEntityType();
+        SceneLevelContext const level(builder, groupType, widened(group.GetName()));
+        if (!level.IsOK())
+            continue;
+        RenderId groupPath;
+        // The last object of a group stands for the group's node.
+        if (builder->GetCurrentRenderId(groupPath))
+            m_pmiElements[EntityId(groupType, groupType, groupType)] = pmi;
+        renderVizPMI(*pmi, m_geometryBox, transformation);
+    }
+
+    std::vector<KolbaVizCore::VizMesh*> const& meshes = m_pmiContainer->GetVizFTACGMeshes();
+    std::vector<KolbaVizCore::VizWire*> const& wires = m_pmiContainer->GetVizFTACGWires();
+    std::vector<KolbaVizCore::VizPointSet*> const& sets = m_pmiContainer->GetVizFTACGPointSets();
+    if (!meshes.empty() || !wires.empty() || !sets.empty()) {
+        KolbaVizCore::EntityTypeContext const fta(builder, KolbaVizCore::FTAGeometry,
+                                                  u"FTAGeometry");
+        if (fta.IsOK()) {
+            // Opens the body node of one FTA element, records it and lets `draw` fill it.
+            auto const body = [&](VizElement& element, char16_t const* name, bool isMesh,
+                                  auto const& draw) {
+                KolbaVizCore::BodyContext const context(
+                    builder, static_cast<std::uint32_t>(element.GetID()), name);
+                if (!context.IsOK())
+                    return;
+                if (isMesh) {
+                    if (KolbaVizCore::AView3DAdapter* const adapter = builder->GetView3DAdapter())
+                        if (KolbaVizCore::IView3D* const view = adapter->GetView3D())
+                            view->SetViewOption(kFTAMeshViewOption);
+                }
+                if (scaled)
+                    applyTransform(transformation);
+                recordAtCurrentPath(element, m_pmiElements);
+                draw();
+            };
+            for (KolbaVizCore::VizMesh* const mesh : meshes)
+                if (mesh)
+                    body(*mesh, u"Mesh", true,
+                         [&] { renderVizMesh(*mesh, m_geometryBox, kFTAMeshAlpha); });
+            for (KolbaVizCore::VizWire* const wire : wires)
+                if (wire)
+                    body(*wire, u"Wire", false, [&] { renderVizWire(*wire, m_geometryBox); });
+            for (KolbaVizCore::VizPointSet* const set : sets)
+                if (set)
+                    body(*set, u"PointSet", false, [&] { renderVizPointSet(*set, m_geometryBox); });
+        }
+    }
+    // The box was gathered unscaled; it takes the scale whatever the nodes hold.
+    m_geometryBox.Scale(scale);
+    return path;
+}
+
+void PmiRenderer::renderVizPMI(KolbaVizCore::VizPMI& pmi, VizBox& box,
+                               VizTransf const& transformation) {
+    SceneBuilder* const builder = getSceneBuilder();
+    std::vector<KolbaVizCore::VizEdge*> const& edges = pmi.GetEdges();
+    std::vector<KolbaVizCore::VizFace*> const& faces = pmi.GetFaces();
+    std::vector<KolbaVizCore::VizText*> const& texts = pmi.GetTexts();
+    SceneLevelContext const object(builder, static_cast<std::uint32_t>(pmi.GetID()),
+                                   widened(pmi.GetType().GetName()));
+    if (!object.IsOK())
+        return;
+    recordAtCurrentPath(pmi, m_pmiElements);
+    // Always, so that every PMI object node holds a placement, the identity without scale.
+    applyTransform(transformation);
+
+    KolbaVizCore::RenderingOptions const& options = builder->GetRenderingOptions();
+    if (!edges.empty()) {
+        SceneLevelContext const level(builder, KolbaVizCore::Edge, u"PMI Edges");
+        if (level.IsOK()) {
+            for (KolbaVizCore::VizEdge* const edge : edges) {
+                if (!edge)
+                    continue;
+                RGBAColor color = options.GetDefaultEdgeColor();
+                bool const own = getVizColor(*edge, color);
+                KolbaVizCore::EntityContext const context(
+                    builder, static_cast<std::uint32_t>(edge->GetID()), u"PMI Edge", own, color);
+                if (context.IsOK())
+                    renderVizEdge(*edge, box, color);
+            }
+        }
+    }
+    if (!faces.empty()) {
+        SceneLevelContext const level(builder, KolbaVizCore::Face, u"PMI Faces");
+        if (level.IsOK()) {
+            for (KolbaVizCore::VizFace* const face : faces) {
+                if (!face)
+                    continue;
+                RGBAColor color = options.GetDefaultFaceColor();
+                bool const own = getVizColor(*face, color);
+                KolbaVizCore::EntityContext const context(
+                    builder, static_cast<std::uint32_t>(face->GetID()), u"PMI Face", own, color);
+                if (context.IsOK())
+                    renderVizFace(*face, box, color);
+            }
+        }
+    }
+    if (!texts.empty()) {
+        SceneLevelContext const level(builder, KolbaVizCore::Text, u"PMI Text Objects");
+        if (level.IsOK()) {
+            for (KolbaVizCore::VizText* const text : texts)
+                if (text)
+                    renderVizText(*text, box);
+        }
+    }
+    if (pmi.GetHidden())
+        builder->SetVisibility(false);
+}
+
+RenderId PmiRenderer::renderViews() {
+    if (!m_pmiContainer)
+        return RenderId();
+    return renderCollections(KolbaVizCore::Views, u"Views", m_pmiContainer->GetViews(),
+                             m_viewElements);
+}
+
+RenderId PmiRenderer::renderCaptures() {
+    if (!m_pmiContainer)
+        return RenderId();
+    return renderCollections(KolbaVizCore::Captures, u"Captures", m_pmiContainer->GetCaptures(),
+                             m_captureElements);
+}
+
+template <typename Collection>
+RenderId PmiRenderer::renderCollections(EntityType const type, char16_t const* name,
+                                        std::vector<Collection*> const& collections,
+                                        std::map<EntityId, VizElement const*>& map) {
+    SceneBuilder* const builder = getSceneBuilder();
+    if (!builder)
+        return RenderId();
+    RenderId result;
+    KolbaVizCore::EntityTypeContext const top(builder, type, name);
+    if (!top.IsOK())
+        return RenderId();
+    builder->GetCurrentRenderId(result);
+    for (Collection* const collection : collections) {
+        if (!collection)
+            continue;
+        RenderId path;
+        // The last view or capture stands for the whole node.
+        if (builder->GetCurrentRenderId(path))
+            map[EntityId(type, type, type)] = collection;
+        // Complete by now: renderPMI has recorded every PMI object.
+        collection->SetEntityMap(m_pmiElements);
+        SceneLevelContext const level(builder, static_cast<std::uint32_t>(collection->GetID()),
+                                      collection->GetName());
+        if (!level.IsOK() || !builder->GetCurrentRenderId(path))
+            continue;
+        if (collection->GetHidden())
+            builder->SetVisibility(false);
+        collection->Set3DRenderID(path);
+        EntityId entity;
+        if (!Convert(path, entity))
+            entity = EntityId(type, type, static_cast<std::uint32_t>(collection->GetID()));
+        map[entity] = collection;
+        collection->SetEntityID(entity);
+        renderVizViewCap(*collection);
+    }
+    return result;
+}
+
+void PmiRenderer::renderVizViewCap(KolbaVizCore::VizPMICollection& collection) {
+    float const* const plane = collection.GetPlaneRectangle();
+    if (!plane)
+        return;
+    SceneBuilder* const builder = getSceneBuilder();
+    auto const tag = static_cast<std::uint32_t>(collection.GetID() + 1);
+    SceneLevelContext const level(builder, tag, u"Plane Rectangle");
+    if (!level.IsOK())
+        return;
+    builder->SetLineStyle("dashed", -1.0f);
+    builder->SetCurrentColor(RGBAColor(255, 255, 255, 255), false);
+    if (KolbaVizCore::AGeometryItemFactory* const factory = getGeometryItemFactory()) {
+        if (KolbaVizCore::GeometryItem* const item =
+                factory->MakePolyline(tag, plane, kPlaneRectangleFloats))
+            builder->AddGeometryItem(item); // the builder takes the item over
+    }
+}
+
+void PmiRenderer::recordAtCurrentPath(VizElement& element,
+                                      std::map<EntityId, VizElement const*>& map) {
+    RenderId path;
+    if (!getSceneBuilder()->GetCurrentRenderId(path))
+        return;
+    element.Set3DRenderID(path);
+    EntityId entity;
+    if (!Convert(path, entity))
+        return;
+    map[entity] = &element;
+    element.SetEntityID(entity);
+}
+
+bool PmiRenderer::isOwned(unsigned long const& tag) {
+    return std::find(m_ownerReferences.begin(), m_ownerReferences.end(),
+                     static_cast<std::uint32_t>(tag)) != m_ownerReferences.end();
+}
+
+bool PmiRenderer::isOwned(RenderId const& id, unsigned long& owner) {
+    owner = kNoOwner;
+    for (int i = 1; i < id.Length(); ++i) {
+        if (isTopTag(id[i]) && isOwned(id[i - 1])) {
+            owner = id[i - 1];
+            return true;
+        }
+    }
+    return false;
+}
+
+bool PmiRenderer::Convert(RenderId const& id, EntityId& entity) {
+    unsigned long owner = kNoOwner;
+    if (!isOwned(id, owner))
+        return false;
+    entity = EntityId();
+    int const n = id.Length();
+    int last = 0;
+    for (int i = 0; i < n; ++i)
+        if (id[i] == KolbaVizCore::PMI)
+            last = i;
+    auto const set = [&entity](std::uint32_t parent, std::uint32_t type, std::uint32_t value) {
+        entity = EntityId(parent, type, value);
+        return true;
+    };
+    if (id[last] == KolbaVizCore::PMI && last > 1 && id[last - 1] == owner) {
+        if (last == n - 1)
+            return set(KolbaVizCore::PMI, KolbaVizCore::Group, KolbaVizCore::PMI);
+        std::uint32_t const group = id[last + 1];
+        return set(group, typeFromTag(group), last + 2 < n ? id[last + 2] : group);
+    }
+    for (int i = last; i < n; ++i) {
+        std::uint32_t const tag = id[i];
+        if (tag == KolbaVizCore::Views || tag == KolbaVizCore::Captures)
+            return set(tag, tag, i + 1 < n ? id[i + 1] : tag);
+        if (tag != KolbaVizCore::PMI)
+            continue;
+        if (i == n - 1)
+            return set(KolbaVizCore::PMI, KolbaVizCore::Group, KolbaVizCore::PMI);
+        std::uint32_t const next = id[i + 1];
+        return set(next, typeFromTag(next), i + 2 < n ? id[i + 2] : next);
+    }
+    return false;
+}
+
+bool PmiRenderer::Convert(EntityId const& entity, RenderId& id) {
+    id = RenderId();
+    std::map<EntityId, VizElement const*> const* map = &m_pmiElements;
+    if (entity.GetType() == KolbaVizCore::Views)
+        map = &m_viewElements;
+    else if (entity.GetType() == KolbaVizCore::Captures)
+        map = &m_captureElements;
+    else if (!entity.IsAnnotation())
+        return false;
+    auto const found = map->find(entity);
+    if (found == map->end() || !found->second)
+        return false;
+    found->second->Get3DRenderID(id);
+    bool const summary =
+        entity.GetId() == entity.GetParentId() && entity.GetParentId() == entity.GetType();
+    if (summary && id.Length() > 2)
+        id.SetLength(id.Length() - 1);
+    return true;
+}
+
+bool PmiRenderer::ConvertToHighlight(RenderId const&, RenderId*&, int&) {
+    return false;
+}
+
+} // namespace VizBridgeTarvex
