@@ -1,5 +1,6 @@
 #pragma once
 
+#include <VizBridge/contracts/kolba/Node.h>
 #include <VizBridge/contracts/kolba/VizElement.h>
 
 #include <memory>
@@ -46,10 +47,15 @@ protected:
 
     /// Keeps `element` until the end of the running Load (or, outside a Load, until the
     /// loader goes), and gives its address for makeOne to return. Null stays null.
+    /// The element gets an id of its own from the counter of scene node ids: element ids tag
+    /// the nodes the elements are drawn in, and these never meet an entity type or a level
+    /// tag in a path, nor another element.
     template <class Element> Element* keep(std::unique_ptr<Element> element) {
         Element* const made = element.get();
-        if (made != nullptr)
+        if (made != nullptr) {
+            made->setID(Node::GetNextId());
             m_kept.push_back(std::move(element)); // on failure `element` still frees it
+        }
         return made;
     }
 
