@@ -2,6 +2,7 @@
 // made of it. Each step of the road is one function below.
 
 #include "ContainerReport.h"
+#include "PmiViewing.h"
 #include "SampleAssembly.h"
 
 #include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
@@ -167,11 +168,33 @@ void Summarise(VizProductStructure const& structure, RoadSummary& summary) {
     summary.errors = structure.GetErrorMessages().size();
 }
 
+/// Step 5, after a render: what a viewer asks of the PMI. The Bracket stands at z 50 in its
+/// assembly; its dimension "Length 60" runs along x at y 0, z 70 in the world.
+void ViewPMI(VizProductStructure& structure, KolbaVizCore::SceneBuilder const& scene,
+             KolbaVizCore::AView3DAdapter& view) {
+    std::cout << "PMI in the scene:\n";
+    VizBridgeExamples::PrintPMIScene(std::cout, scene.Dump());
+    std::cout << "Picking:\n";
+    VizBridgeExamples::PrintPick(std::cout, structure, view, "through the dimension line",
+                                 {30, -100, 70}, {0, 1, 0});
+    VizBridgeExamples::PrintPick(std::cout, structure, view, "down onto the Bracket's top",
+                                 {50, 15, 200}, {0, 0, -1});
+    VizBridgeExamples::PrintPick(std::cout, structure, view, "past everything", {500, 500, 500},
+                                 {0, 0, 1});
+    std::cout << "Activation:\n";
+    using Sample = VizBridgeExamples::SampleAssembly;
+    if (VizBridgeTarvex::VizPMIContainer const* const pmi =
+            structure.GetVizPMIContainer(static_cast<int>(Sample::kBracketId)))
+        VizBridgeExamples::ActivateAndPrint(std::cout, structure, *pmi);
+}
+
 /// Step 4: a renderer draws the structure into the host's scene. The host keeps the scene
 /// builder, the view and the modeler (if any) alive for as long as the renderer lives;
 /// deleting the renderer removes what it drew. `printScene`: print the whole scene tree.
+/// `viewPMI`: print the PMI part of the scene, pick along two rays and activate the
+/// Bracket's capture and view.
 void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModelerServices* modeler,
-                     bool printScene, RoadSummary& summary) {
+                     bool printScene, bool viewPMI, RoadSummary& summary) {
     KolbaVizCore::RecordingView3D view;
     KolbaVizCore::SceneBuilder scene;
     KolbaVizCore::View3DAdapter adapter(&view, &scene);
@@ -192,6 +215,8 @@ void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModeler
     for (auto const& sphere : view.GetExtentSpheres())
         std::cout << "Extents: centre (" << sphere.center[0] << ", " << sphere.center[1] << ", "
                   << sphere.center[2] << "), radius " << sphere.radius << '\n';
+    if (viewPMI)
+        ViewPMI(structure, scene, adapter);
 
     renderer->ClearAll();
     std::cout << "After ClearAll: " << scene.GetNodeCount() << " node(s)\n";
@@ -225,7 +250,7 @@ RoadSummary RunRoad(VizBridgeExamples::SampleAssembly const& sample, int process
     PrintFailures(*structure);
     PrintTimes(times);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, &modeler, true, summary);
+    RenderStructure(*structure, &modeler, true, false, summary);
 
     // The structure goes last: after the builder and every renderer made on it.
     structure.reset();
@@ -268,7 +293,7 @@ RoadSummary RunVisualisationRoad(VizBridgeExamples::SampleAssembly const& sample
     PrintContainers(*structure);
     PrintFailures(*structure);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, nullptr, false, summary);
+    RenderStructure(*structure, nullptr, false, !tesselateText, summary);
     structure.reset();
     return summary;
 }

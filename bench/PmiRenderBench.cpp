@@ -1,0 +1,192 @@
+// Speed and memory of drawing PMI, and of picking in the drawn scene.
+//
+// The product: 1 000 part references, each with 50 PMI objects (notes of one polyline of
+// two segments each, imported as a host imports graphical PMI) and 10 root instances that
+// place it in turn. The renderer draws each reference's PMI below its first instance;
+// every further instance gets a node with its placement and a node reference to it.
+//
+//   BM_RenderPMI    renders the product into an empty scene; the scene is cleared outside
+//                   the timed region.
+//     pmi_per_second              PMI objects drawn per second (50 000 a render)
+//     bytes_per_further_instance  (growth(10 000) - growth(1 000)) / 9 000, where growth(N)
+//                                 is the heap growth of rendering the references with N
+//                                 instances in all: what an instance costs beyond the
+//                                 first of its reference
+//   BM_PickVisual   VizProductStructure::PickVisual along rays straight down through the
+//                   PMI of instances spread over the product.
+//     picks_per_second            rays answered per second
+//     hit_ratio                   of those rays, the share that found a PMI object
+// Heap bytes are those requested from operator new.
+
+#include "support/LiveBytes.h"
+#include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
+#include <VizBridge/contracts/kolba/Ray.h>
+#include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/View3DAdapter.h>
+#include <VizBridge/contracts/tarvex/TarvexDocument.h>
+#include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
+#include <VizBridge/contracts/tarvex/TarvexModel.h>
+#include <VizBridge/contracts/tarvex/TarvexPSImportResult.h>
+#include <VizBridge/import/UniqueProductStructure.h>
+#include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/model/VizProductStructure.h>
+#include <VizBridge/render/TarvexRenderer.h>
+#include <VizBridge/render/UniqueRenderer.h>
+
+#include <benchmark/benchmark.h>
+
+#include <cstdint>
+#include <memory>
+#include <string>
+
+using VizBridgeBench::LiveBytes;
+
+namespace {
+
+using KolbaVizCore::SceneBuilder;
+using VizBridgeTarvex::VizProductStructure;
+
+constexpr unsigned int kReferences = 1000;
+constexpr unsigned int kPMIPerReference = 50;
+constexpr unsigned int kInstancesPerReference = 10;
+constexpr double kSpacing = 200.0; ///< between instances, beyond a reference's PMI
+
+/// `stem` and `number` as one text. Appended, not added: GCC 12 warns wrongly about
+/// `"text" + std::string` in optimised builds.
+VizPort::WString Named(char const* stem, unsigned int number) {
+    std::string name = stem;
+    name += std::to_string(number);
+    return VizPort::Widen(name);
+}
+
+/// 50 notes side by side along x, each a polyline over (2k, 0, 0) (2k + 1, 0, 0)
+/// (2k + 1, 1, 0).
+TarvexAuthoredVisuData const& PMI() {
+    static TarvexAuthoredVisuData const data = [] {
+        TarvexAuthoredVisuData made;
+        made.unit = TarvexLengthUnit_Millimeter;
+        for (unsigned int k = 0; k < kPMIPerReference; ++k) {
+            TarvexAuthoredVisuNode& note = made.nodes.emplace_back();
+            note.type = TarvexVisuNode::VisuNote;
+            note.pmi.id = Named("note", k);
+            TarvexAuthoredVisuEdge& line = note.pmi.edges.emplace_back();
+            float const x = 2.0f * static_cast<float>(k);
+            line.points = {x, 0, 0, x + 1, 0, 0, x + 1, 1, 0};
+        }
+        return made;
+    }();
+    return data;
+}
+
+/// `perReference` root instances of each reference, imported with their PMI.
+std::unique_ptr<VizProductStructure> MakeProduct(unsigned int perReference) {
+    TarvexModel model;
+    model.SetProductName(u"PmiRenderBench");
+    model.SetUnits(TarvexLengthUnit_Millimeter);
+    for (unsigned int reference = 1; reference <= kReferences; ++reference)
+        model.AddPart(reference, VizPort::Widen(std::to_string(reference).insert(0, "Part"))).visu =
+            PMI();
+    for (unsigned int copy = 0; copy < perReference; ++copy) {
+        for (unsigned int reference = 1; reference <= kReferences; ++reference) {
+            TarvexPlacement placement;
+            placement.translation[0] = kSpacing * (reference - 1);
+            placement.translation[1] = kSpacing * copy;
+            model.AddRootInstance(reference, Named("P", reference) + u"." + Named("", copy))
+                .placement = placement;
+        }
+    }
+    TarvexPSImportResult const result = model.GetImportResult();
+    TarvexInputProductStructure const input = model.GetInputProductStructure();
+    TarvexDocument document = model.GetDocument();
+    std::unique_ptr<VizProductStructure> structure =
+        VizBridgeTarvex::MakeUniqueVizProductStructure(result, input, document);
+    VizBridgeTarvex::VizBuilder builder(*structure, input, nullptr);
+    builder.SetImportVisu(true);
+    builder.SetImportPMI(true);
+    builder.ImportAndBuildPS();
+    return structure;
+}
+
+std::unique_ptr<SceneBuilder> MakeScene() {
+    auto builder = std::make_unique<SceneBuilder>();
+    builder->SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
+    return builder;
+}
+
+/// Heap growth of one render of a product with `perReference` instances of each reference.
+std::int64_t RenderGrowth(unsigned int perReference) {
+    std::unique_ptr<VizProductStructure> const structure = MakeProduct(perReference);
+    std::unique_ptr<SceneBuilder> const scene = MakeScene();
+    auto const renderer =
+        VizBridgeTarvex::MakeUniqueRenderer(structure.get(), nullptr, scene.get());
+    std::int64_t const before = LiveBytes();
+    bool const rendered = renderer->Render();
+    return rendered ? LiveBytes() - before : 0;
+}
+
+void BM_RenderPMI(benchmark::State& state) {
+    std::unique_ptr<VizProductStructure> const structure = MakeProduct(kInstancesPerReference);
+    std::int64_t const growthOne = RenderGrowth(1);
+    std::int64_t const growthAll = RenderGrowth(kInstancesPerReference);
+    if (growthOne == 0 || growthAll == 0) {
+        state.SkipWithError("a render failed");
+        return;
+    }
+    std::unique_ptr<SceneBuilder> const scene = MakeScene();
+    for (auto _ : state) {
+        auto renderer = VizBridgeTarvex::MakeUniqueRenderer(structure.get(), nullptr, scene.get());
+        if (!renderer->Render()) {
+            state.SkipWithError("the render failed");
+            return;
+        }
+        state.PauseTiming();
+        renderer.reset(); // removes its nodes from the scene
+        state.ResumeTiming();
+    }
+    state.counters["pmi_per_second"] =
+        benchmark::Counter(static_cast<double>(state.iterations()) * kReferences * kPMIPerReference,
+                           benchmark::Counter::kIsRate);
+    state.counters["bytes_per_further_instance"] =
+        static_cast<double>(growthAll - growthOne) /
+        static_cast<double>(kReferences * (kInstancesPerReference - 1));
+}
+BENCHMARK(BM_RenderPMI)->Unit(benchmark::kMillisecond)->Iterations(3);
+
+void BM_PickVisual(benchmark::State& state) {
+    std::unique_ptr<VizProductStructure> const structure = MakeProduct(kInstancesPerReference);
+    std::unique_ptr<SceneBuilder> const scene = MakeScene();
+    KolbaVizCore::View3DAdapter adapter(nullptr, scene.get());
+    scene->SetView3DAdapter(&adapter);
+    auto const renderer =
+        VizBridgeTarvex::MakeUniqueRenderer(structure.get(), nullptr, scene.get());
+    if (!renderer->Render()) {
+        state.SkipWithError("the render failed");
+        return;
+    }
+    std::int64_t rays = 0;
+    std::int64_t hits = 0;
+    for (auto _ : state) {
+        // Down through the first segment of note (rays % 50) of an instance that moves on
+        // by a prime step, so that the rays spread over the product.
+        std::int64_t const instance = (rays * 7919) % (kReferences * kInstancesPerReference);
+        KolbaVizCore::Ray ray;
+        ray.origin[0] = kSpacing * static_cast<double>(instance % kReferences) +
+                        2.0 * static_cast<double>(rays % kPMIPerReference) + 0.5;
+        ray.origin[1] = kSpacing * static_cast<double>(instance / kReferences);
+        ray.origin[2] = 10.0;
+        ray.direction[2] = -1.0;
+        VizBridgeTarvex::VizElement* element = nullptr;
+        VizBridgeTarvex::VizPSEntry* entry = nullptr;
+        if (structure->PickVisual(&adapter, ray, element, entry) && element)
+            ++hits;
+        ++rays;
+    }
+    state.counters["picks_per_second"] =
+        benchmark::Counter(static_cast<double>(rays), benchmark::Counter::kIsRate);
+    state.counters["hit_ratio"] = rays == 0 ? 0.0 : static_cast<double>(hits) / rays;
+}
+BENCHMARK(BM_PickVisual)->Unit(benchmark::kMillisecond)->Iterations(20);
+
+} // namespace
+
+BENCHMARK_MAIN();
