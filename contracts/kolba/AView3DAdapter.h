@@ -17,6 +17,11 @@ public:
     /// The path of the nearest shown node that `ray` (world coordinates) hits: true and
     /// `id` filled; false and `id` untouched on a miss.
     virtual bool PickRenderId(Ray const& ray, RenderId& id) = 0;
+    /// The path of the same node as it was drawn: for a node shown again through a node
+    /// reference, its own path rather than the path through the reference. The elements
+    /// drawn there know that path. This base has no scene to look into and answers as
+    /// PickRenderId.
+    virtual bool PickDrawnRenderId(Ray const& ray, RenderId& id) { return PickRenderId(ray, id); }
 };
 
 } // namespace KolbaVizCore

@@ -16,6 +16,12 @@ void PointItem::AddToBox(Matrix4 const& world, VizBox& box) const {
     box.Add(point);
 }
 
+bool PointItem::intersectRay(Ray const& ray, Matrix4 const& world, double tolerance,
+                             double& t) const {
+    double const local[3] = {m_position[0], m_position[1], m_position[2]};
+    return nearPoint(ray, world, local, tolerance, t);
+}
+
 std::string PointItem::describeData() const {
     std::ostringstream text;
     text << "at=" << m_position[0] << ',' << m_position[1] << ',' << m_position[2];

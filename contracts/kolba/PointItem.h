@@ -17,6 +17,8 @@ public:
 
 protected:
     std::string describeData() const override;
+    bool intersectRay(Ray const& ray, Matrix4 const& world, double tolerance,
+                      double& t) const override;
 
 private:
     std::array<float, 3> m_position;

@@ -91,7 +91,8 @@ std::vector<std::array<int, 3>> PolygonItem::GetTriangles() const {
     return triangles;
 }
 
-bool PolygonItem::IntersectRay(Ray const& ray, Matrix4 const& world, double& t) const {
+bool PolygonItem::intersectRay(Ray const& ray, Matrix4 const& world, double /*tolerance*/,
+                               double& t) const {
     bool found = false;
     double nearest = 0.0;
     for (std::array<int, 3> const& triangle : GetTriangles()) {

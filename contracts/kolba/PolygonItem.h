@@ -25,11 +25,13 @@ public:
     /// The triangles the indices make, as triples of point numbers.
     std::vector<std::array<int, 3>> GetTriangles() const;
 
-    bool IntersectRay(Ray const& ray, Matrix4 const& world, double& t) const override;
     void AddToBox(Matrix4 const& world, VizBox& box) const override;
 
 protected:
     std::string describeData() const override;
+    /// The nearest triangle the ray pierces, from either side; a surface needs no tolerance.
+    bool intersectRay(Ray const& ray, Matrix4 const& world, double tolerance,
+                      double& t) const override;
 
 private:
     std::vector<float> m_vertices;

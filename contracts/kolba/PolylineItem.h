@@ -18,6 +18,8 @@ public:
 
 protected:
     std::string describeData() const override;
+    bool intersectRay(Ray const& ray, Matrix4 const& world, double tolerance,
+                      double& t) const override;
 
 private:
     std::vector<float> m_coordinates;

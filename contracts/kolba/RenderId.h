@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <vector>
 
@@ -27,6 +28,15 @@ public:
     std::uint32_t GetLeading() const { return m_leading; }
     void SetLeading(std::uint32_t leading) { m_leading = leading; }
     std::vector<std::uint32_t> const& GetTags() const { return m_tags; }
+
+    /// The same leading word and the same tags.
+    bool operator==(RenderId const& other) const = default;
+    /// Whether this path runs through `prefix`: the same leading word, and `prefix`'s tags
+    /// begin this path's. A path begins with itself.
+    bool BeginsWith(RenderId const& prefix) const {
+        return m_leading == prefix.m_leading && prefix.m_tags.size() <= m_tags.size() &&
+               std::equal(prefix.m_tags.begin(), prefix.m_tags.end(), m_tags.begin());
+    }
 
 private:
     std::uint32_t m_leading = 0;

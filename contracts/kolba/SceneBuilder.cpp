@@ -99,6 +99,7 @@ Matrix4 placed(Matrix4 const& parentWorld, Node const& node) {
 
 struct PickState {
     Ray const& ray;
+    double tolerance = 0.0;
     bool found = false;
     double nearest = 0.0;
     RenderId hit;
@@ -112,7 +113,7 @@ void pickBelow(Node const& node, Matrix4 const& parentWorld, RenderId& path, Pic
     for (std::size_t index = 0; index < node.GetItemCount(); ++index) {
         double t = 0.0;
         // Strictly nearer only: of two equal hits the one met first stands.
-        if (node.GetItem(index)->IntersectRay(state.ray, world, t) &&
+        if (node.GetItem(index)->IntersectRay(state.ray, world, state.tolerance, t) &&
             (!state.found || t < state.nearest)) {
             state.found = true;
             state.nearest = t;
@@ -159,6 +160,7 @@ SceneBuilder::SceneBuilder(AView3DAdapter* view)
 SceneBuilder::~SceneBuilder() = default;
 
 bool SceneBuilder::AddGeometryItem(GeometryItem* item) {
+    ++m_revision;
     std::unique_ptr<GeometryItem> owned(item); // handed over by the caller
     Node* const node = currentNode();
     if (node == nullptr || !owned)
@@ -168,21 +170,25 @@ bool SceneBuilder::AddGeometryItem(GeometryItem* item) {
 }
 
 void SceneBuilder::SetCurrentColor(RGBAColor const& color, bool const& override) {
+    ++m_revision;
     if (Node* const node = currentNode())
         colorNode(node, color, override);
 }
 
 void SceneBuilder::SetLineStyle(std::string const& pattern, float const& width) {
+    ++m_revision;
     if (Node* const node = currentNode())
         node->m_lineStyle = std::make_unique<Node::LineStyle>(Node::LineStyle{pattern, width});
 }
 
 void SceneBuilder::SetCurrentTransform(double const* matrix) {
+    ++m_revision;
     if (Node* const node = currentNode())
         node->setTransform(Matrix4(matrix));
 }
 
 bool SceneBuilder::RemoveNode(RenderId const& path) {
+    ++m_revision;
     Resolution resolution;
     if (!resolve(path, resolution))
         return false;
@@ -204,6 +210,7 @@ bool SceneBuilder::RemoveNode(RenderId const& path) {
 }
 
 bool SceneBuilder::AddNodeReference(RenderId const& path) {
+    ++m_revision;
     Node* const current = currentNode();
     Resolution resolution;
     if (current == nullptr || !resolve(path, resolution))
@@ -233,6 +240,7 @@ bool SceneBuilder::GetCurrentRenderId(RenderId& id) const {
 }
 
 void SceneBuilder::SetVisibility(bool const& visible) {
+    ++m_revision;
     if (Node* const node = currentNode())
         node->m_visible = visible;
 }
@@ -342,7 +350,7 @@ bool SceneBuilder::Pick(Ray const& ray, RenderId& hit, double& distance) const {
                   ray.direction[2] * ray.direction[2]);
     if (!(length > 0.0) || !std::isfinite(length))
         return false;
-    PickState state{ray, false, 0.0, RenderId(1)};
+    PickState state{ray, m_pickTolerance, false, 0.0, RenderId(1)};
     RenderId path(1);
     Matrix4 const identity;
     for (std::size_t index = 0; index < m_anchor->GetChildCount(); ++index)
@@ -354,7 +362,16 @@ bool SceneBuilder::Pick(Ray const& ray, RenderId& hit, double& distance) const {
     return true;
 }
 
+bool SceneBuilder::SetPickTolerance(double tolerance) {
+    ++m_revision;
+    if (!(tolerance >= 0.0) || !std::isfinite(tolerance))
+        return false;
+    m_pickTolerance = tolerance;
+    return true;
+}
+
 bool SceneBuilder::Clear() {
+    ++m_revision;
     if (!m_open.empty())
         return false;
     m_anchor->m_children.clear();
@@ -379,6 +396,7 @@ void SceneBuilder::endConstruction() {
 
 Node* SceneBuilder::openLevel(ContextKind kind, std::uint32_t tag, VizPort::WString const& name,
                               std::uint32_t containerType) {
+    ++m_revision;
     if (isRefused(kind, tag, name)) {
         ++m_refusedContexts;
         return nullptr;

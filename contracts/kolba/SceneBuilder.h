@@ -128,10 +128,23 @@ public:
     ///   [ override]][ hidden][ line=<pattern>/<width>][ {<item>; <item>}]
     /// then one line "-> ref <tags/of/target>" per reference, then the children.
     std::string Dump() const;
-    /// The nearest triangle of a shown polygon item that `ray` (world coordinates) meets,
-    /// through references and placements: true, the path of the item's node and the
-    /// distance from the ray's origin. On a miss false and both left alone.
+    /// The nearest shown item that `ray` (world coordinates) meets, through references and
+    /// placements: a triangle it pierces, or a line, point or text it passes within the pick
+    /// tolerance of (see GeometryItem::IntersectRay). True, the path of the item's node and
+    /// the distance from the ray's origin to the hit, or for a line, point or text to the
+    /// ray's point nearest to it. On a miss false and both left alone.
     bool Pick(Ray const& ray, RenderId& hit, double& distance) const;
+    /// Counts the changes to the scene (nodes, items, placements, colours, visibility,
+    /// references, the pick tolerance), so that a view may keep an answer while it stays.
+    std::uint64_t GetRevision() const { return m_revision; }
+    /// About three pixels' width on a hand-sized part modelled in millimetres that fills a
+    /// screen: lines can be hit with a mouse without a neighbour a few millimetres off
+    /// catching the ray. A host that knows its camera sets the width of a few pixels instead.
+    static constexpr double DefaultPickTolerance = 0.5;
+    /// How far (world units) from a pick ray a line, point or text may lie and still be hit.
+    /// False, and the tolerance as it was, for a negative or not finite one.
+    bool SetPickTolerance(double tolerance);
+    double GetPickTolerance() const { return m_pickTolerance; }
     /// Removes every scene. False, and nothing removed, while a level is open.
     bool Clear();
 
@@ -159,11 +172,13 @@ private:
     void detachSubtree(Node* node);
 
     std::unique_ptr<Node> m_anchor; ///< owns the scene tops; no node of the scene
-    std::vector<Node*> m_open;      ///< open levels, oldest first; owned through m_anchor
+    std::uint64_t m_revision = 0;
+    std::vector<Node*> m_open; ///< open levels, oldest first; owned through m_anchor
     int m_constructionDepth = 0;
     RenderingOptions m_options;
     AView3DAdapter* m_view = nullptr; ///< not owned
     std::unique_ptr<AGeometryItemFactory> m_factory;
+    double m_pickTolerance = DefaultPickTolerance;
     std::vector<VizPort::WString> m_failingNames;
     std::vector<std::uint32_t> m_failingTags;
     std::vector<ContextKind> m_failingKinds;

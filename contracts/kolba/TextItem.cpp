@@ -19,6 +19,13 @@ void TextItem::AddToBox(Matrix4 const& world, VizBox& box) const {
     box.Add(point);
 }
 
+bool TextItem::intersectRay(Ray const& ray, Matrix4 const& world, double tolerance,
+                            double& t) const {
+    // Where the text stands; see IntersectRay for why its glyphs do not count.
+    double const origin[3] = {0.0, 0.0, 0.0};
+    return nearPoint(ray, world, origin, tolerance, t);
+}
+
 std::string TextItem::describeData() const {
     std::ostringstream text;
     text << '"' << VizPort::Narrow(m_text) << "\" font=\"" << VizPort::Narrow(m_fontName)

@@ -29,6 +29,8 @@ public:
 
 protected:
     std::string describeData() const override;
+    bool intersectRay(Ray const& ray, Matrix4 const& world, double tolerance,
+                      double& t) const override;
 
 private:
     VizPort::WString m_text;

@@ -20,6 +20,10 @@ public:
     VizContainer& operator=(VizContainer const&) = delete;
 
     std::string GetTypeName() const override { return "VizContainer"; }
+    /// The mesh, face, edge, wire, point set or group of points, plain or CG, that `view`
+    /// picks along `ray`: the one drawn deepest above the picked node (see pickAmong). The
+    /// element stays the container's.
+    bool PickVisual(AView3DAdapter* view, Ray const& ray, VizElement*& element) override;
 
     /// Factor from the data's length unit to the scene's.
     void SetScaleFactor(double factor) { m_scaleFactor = factor; }

@@ -4,6 +4,22 @@
 
 namespace KolbaVizCore {
 
+bool VizPMIContainer::PickVisual(AView3DAdapter* view, Ray const& ray, VizElement*& element) {
+    std::vector<VizElement*> candidates;
+    for (VizPMI* const pmi : m_pmis.Get()) {
+        candidates.push_back(pmi);
+        candidates.insert(candidates.end(), pmi->GetEdges().begin(), pmi->GetEdges().end());
+        candidates.insert(candidates.end(), pmi->GetFaces().begin(), pmi->GetFaces().end());
+        candidates.insert(candidates.end(), pmi->GetTexts().begin(), pmi->GetTexts().end());
+    }
+    addCandidates(m_ftaMeshes.Get(), candidates);
+    addCandidates(m_ftaWires.Get(), candidates);
+    addCandidates(m_ftaPointSets.Get(), candidates);
+    candidates.insert(candidates.end(), m_views.Get().begin(), m_views.Get().end());
+    candidates.insert(candidates.end(), m_captures.Get().begin(), m_captures.Get().end());
+    return pickAmong(view, ray, candidates, element);
+}
+
 void VizPMIContainer::AddSemanticPMI(SemanticPMI* record) {
     if (record == nullptr)
         return;

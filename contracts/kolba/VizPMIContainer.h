@@ -29,6 +29,10 @@ public:
     VizPMIContainer& operator=(VizPMIContainer const&) = delete;
 
     std::string GetTypeName() const override { return "VizPMIContainer"; }
+    /// The PMI object, PMI edge, face or text, FTA element, view or capture that `view`
+    /// picks along `ray`: the one drawn deepest above the picked node (see pickAmong). The
+    /// element stays the container's.
+    bool PickVisual(AView3DAdapter* view, Ray const& ray, VizElement*& element) override;
 
     /// Factor from the data's length unit to the scene's.
     void SetScaleFactor(double const& factor) { m_scaleFactor = factor; }

@@ -1,5 +1,6 @@
 #include <VizBridge/contracts/kolba/SceneBuilder.h>
 
+#include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
 #include <VizBridge/contracts/kolba/BodyContext.h>
 #include <VizBridge/contracts/kolba/ConstructionContext.h>
 #include <VizBridge/contracts/kolba/ContainerContext.h>
@@ -12,6 +13,7 @@
 
 #include <gtest/gtest.h>
 
+#include <limits>
 #include <sstream>
 #include <stdexcept>
 #include <string>
@@ -104,12 +106,12 @@ std::string openLevels(SceneBuilder& builder) {
     return ok;
 }
 
-/// "<leading word>: <tags> at <distance>" for what `ray` from (x, 0.3, z) along (0, 0, dz)
-/// hits first; "miss" when Pick leaves both of its outputs alone.
-std::string picked(SceneBuilder const& builder, double x, double z, double dz) {
+/// "<leading word>: <tags> at <distance>" for what `ray` hits first; "miss" when Pick
+/// leaves both of its outputs alone.
+std::string pickedBy(SceneBuilder const& builder, Ray const& ray) {
     RenderId hit(5);
     double distance = -1.0;
-    if (!builder.Pick(Ray{{x, 0.3, z}, {0.0, 0.0, dz}}, hit, distance))
+    if (!builder.Pick(ray, hit, distance))
         return hit.GetLeading() == 5 && hit.IsEmpty() && distance == -1.0 ? "miss" : "changed";
     std::ostringstream text;
     text << hit.GetLeading() << ':';
@@ -117,6 +119,63 @@ std::string picked(SceneBuilder const& builder, double x, double z, double dz) {
         text << ' ' << tag;
     text << " at " << distance;
     return text.str();
+}
+
+/// What a ray from (x, 0.3, z) along (0, 0, dz) hits first.
+std::string picked(SceneBuilder const& builder, double x, double z, double dz) {
+    return pickedBy(builder, Ray{{x, 0.3, z}, {0.0, 0.0, dz}});
+}
+
+Ray down(double x, double y) {
+    return Ray{{x, y, 10.0}, {0.0, 0.0, -1.0}};
+}
+
+void placeAt(SceneBuilder& builder, double x, double y, double z) {
+    double const matrix[16] = {1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, x, y, z, 1};
+    builder.SetCurrentTransform(matrix);
+}
+
+/// One level per kind of item below the scene top, each at a height of its own:
+///   1 the triangle (0,0) (1,0) (0,1) at z = 0       2 the polyline (10,0) (12,0) (12,2), z = 1
+///   3 the line set (20,0)-(22,0), (20,2)-(22,2) and an unpaired (24,2), z = 2
+///   4 the point (30,0,3)                              5 a text placed at (40,0,4)
+///   6 at x = 100, showing 3 through a reference
+///   7, 8, 9 stacked over (50,0): a triangle at z = 0, a point at z = 1, a line along y at z = 2
+void buildKinds(SceneBuilder& builder) {
+    AGeometryItemFactory& make = *builder.GetGeometryItemFactory();
+    SceneContext scene(&builder, R, u"ROOT");
+    auto level = [&](std::uint32_t tag, GeometryItem* item) {
+        SceneLevelContext node(&builder, tag, u"kind");
+        builder.AddGeometryItem(item);
+    };
+    {
+        SceneLevelContext triangle(&builder, 1, u"triangle");
+        addTriangle(builder, 1, 0.0f);
+    }
+    float const polyline[9] = {10, 0, 1, 12, 0, 1, 12, 2, 1};
+    level(2, make.MakePolyline(2, polyline, 9));
+    float const pairs[15] = {20, 0, 2, 22, 0, 2, 20, 2, 2, 22, 2, 2, 24, 2, 2};
+    level(3, make.MakeLineSet(3, pairs, 15));
+    level(4, make.MakePoint(4, 30, 0, 3));
+    float const anchor[3] = {7, 7, 7}; // the source's, for hosts: it does not move the text
+    {
+        SceneLevelContext text(&builder, 5, u"text");
+        placeAt(builder, 40, 0, 4);
+        builder.AddGeometryItem(make.MakeText(5, u"note", u"Arial", anchor, FontAttr(), 0));
+    }
+    {
+        SceneLevelContext placed(&builder, 6, u"placed");
+        placeAt(builder, 100);
+        builder.AddNodeReference(pathOf({R, 3}));
+    }
+    {
+        SceneLevelContext under(&builder, 7, u"under");
+        placeAt(builder, 49.8, -0.2, 0);
+        addTriangle(builder, 7, 0.0f);
+    }
+    level(8, make.MakePoint(8, 50, 0, 1));
+    float const across[6] = {50, -1, 2, 50, 1, 2};
+    level(9, make.MakePolyline(9, across, 6));
 }
 
 } // namespace
@@ -230,7 +289,65 @@ TEST(SceneBuilder, PicksTheNearestShownTriangleThroughReferencesAndPlacements) {
     EXPECT_EQ(picked(builder, 10.2, 10, -2), "1: 1 77 1000 10007 10006 12 at 10");
     EXPECT_EQ(picked(builder, 20.2, 10, -2), "1: 1 3000 at 6");
     EXPECT_EQ(picked(builder, 20.2, -10, 0.5), "1: 1 77 1001 10007 10006 12 at 10") << "below";
-    EXPECT_EQ(picked(builder, 15, 10, -2), "miss") << "lines and points are never hit";
+    EXPECT_EQ(picked(builder, 15, 10, -2), "1: 1 3000 at 5") << "the cover's line";
     EXPECT_EQ(picked(builder, 20.8, 10, -2), "miss") << "outside the hypotenuse";
     EXPECT_EQ(picked(builder, 20.2, 10, 0), "miss") << "a ray without direction";
+}
+
+// Tolerance 0.25; rays straight down from z = 10 unless said otherwise.
+TEST(SceneBuilder, PicksLinesPointsAndTextsWithinTheToleranceAndTheNearestOfAllKinds) {
+    SceneBuilder builder;
+    buildKinds(builder);
+    ASSERT_TRUE(builder.SetPickTolerance(0.25));
+    struct Case {
+        char const* what;
+        Ray ray;
+        char const* hit;
+    } const cases[] = {
+        {"triangle", down(0.2, 0.2), "1: 1 1 at 10"},
+        {"a surface takes no tolerance", down(0.55, 0.55), "miss"},
+        {"polyline", down(11, 0), "1: 1 2 at 9"},
+        {"polyline at the tolerance", down(11, 0.25), "1: 1 2 at 9"},
+        {"polyline beyond it", down(11, -0.26), "miss"},
+        {"polyline's second segment", down(12.25, 1), "1: 1 2 at 9"},
+        {"an open polyline", down(11, 1), "miss"},
+        {"line set", down(21, 2.2), "1: 1 3 at 8"},
+        {"past a segment's end", down(22.2, 0), "1: 1 3 at 8"},
+        {"further past it", down(22.3, 0), "miss"},
+        {"between pairs", down(21, 1), "miss"},
+        {"the unpaired point", down(24, 2), "miss"},
+        {"point at the tolerance", down(30, 0.25), "1: 1 4 at 7"},
+        {"point diagonally beyond", down(30.2, 0.2), "miss"},
+        {"behind the origin", Ray{{30, 0, 2.9}, {0, 0, -1}}, "miss"},
+        {"text where its node stands", down(40.1, 0), "1: 1 5 at 6"},
+        {"text beside that", down(41, 0), "miss"},
+        {"line set through a reference", down(121, 2.2), "1: 1 6 3 at 8"},
+        {"across a segment", Ray{{11, -5, 1}, {0, 1, 0}}, "1: 1 2 at 5"},
+        {"along a segment: its near end", Ray{{5, 0, 1}, {2, 0, 0}}, "1: 1 2 at 5"},
+        {"the line above the point above the triangle", down(50, 0), "1: 1 9 at 8"},
+        {"from below the triangle first", Ray{{50, 0, -10}, {0, 0, 1}}, "1: 1 7 at 10"},
+        {"beside the line and the point", down(50.3, 0), "1: 1 7 at 10"},
+    };
+    for (Case const& c : cases)
+        EXPECT_EQ(pickedBy(builder, c.ray), c.hit) << c.what;
+    {
+        SceneContext scene(&builder, R, u"ROOT");
+        SceneLevelContext line(&builder, 9, u"kind");
+        builder.SetVisibility(false);
+    }
+    EXPECT_EQ(pickedBy(builder, down(50, 0)), "1: 1 8 at 9") << "the hidden line is passed";
+}
+
+TEST(SceneBuilder, ThePickToleranceIsHalfAUnitUntilSetToAFiniteNonNegativeValue) {
+    SceneBuilder builder;
+    buildKinds(builder);
+    EXPECT_EQ(pickedBy(builder, down(30.45, 0)), "1: 1 4 at 7");
+    EXPECT_EQ(pickedBy(builder, down(30.55, 0)), "miss");
+    using Limits = std::numeric_limits<double>;
+    for (double const refused : {-1.0, Limits::quiet_NaN(), Limits::infinity()})
+        EXPECT_FALSE(builder.SetPickTolerance(refused)) << refused;
+    EXPECT_EQ(pickedBy(builder, down(30.45, 0)), "1: 1 4 at 7") << "refused values change nothing";
+    EXPECT_TRUE(builder.SetPickTolerance(0.0));
+    EXPECT_EQ(pickedBy(builder, down(30, 0)), "1: 1 4 at 7") << "touching is still a hit";
+    EXPECT_EQ(pickedBy(builder, down(30.01, 0)), "miss");
 }
