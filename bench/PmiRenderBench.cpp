@@ -5,17 +5,20 @@
 // place it in turn. The renderer draws each reference's PMI below its first instance;
 // every further instance gets a node with its placement and a node reference to it.
 //
-//   BM_RenderPMI    renders the product into an empty scene; the scene is cleared outside
-//                   the timed region.
-//     pmi_per_second              PMI objects drawn per second (50 000 a render)
-//     bytes_per_further_instance  (growth(10 000) - growth(1 000)) / 9 000, where growth(N)
-//                                 is the heap growth of rendering the references with N
+//   BM_RenderPMI/N  renders the product, with N PMI objects a reference, into an empty
+//                   scene; the scene is cleared outside the timed region.
+//     pmi_per_second              PMI objects drawn per second (N x 1 000 a render)
+//     bytes_per_further_instance  (growth(10 000) - growth(1 000)) / 9 000, where growth(I)
+//                                 is the heap growth of rendering the references with I
 //                                 instances in all: what an instance costs beyond the
-//                                 first of its reference
+//                                 first of its reference, which stays flat in N
 //   BM_PickVisual   VizProductStructure::PickVisual along rays straight down through the
 //                   PMI of instances spread over the product.
 //     picks_per_second            rays answered per second
-//     hit_ratio                   of those rays, the share that found a PMI object
+//     hit_ratio                   of those rays, the share that found an element and an
+//                                 instance
+//   BM_SceneNodePick  the same rays through the scene library's own pick of a node, which
+//                   PickVisual asks once: what the rest of PickVisual costs beside it.
 // Heap bytes are those requested from operator new.
 
 #include "support/LiveBytes.h"
@@ -23,6 +26,7 @@
 #include <VizBridge/contracts/kolba/Ray.h>
 #include <VizBridge/contracts/kolba/SceneBuilder.h>
 #include <VizBridge/contracts/kolba/View3DAdapter.h>
+#include <VizBridge/contracts/kolba/VizPMIContainer.h>
 #include <VizBridge/contracts/tarvex/TarvexDocument.h>
 #include <VizBridge/contracts/tarvex/TarvexInputProductStructure.h>
 #include <VizBridge/contracts/tarvex/TarvexModel.h>
@@ -38,6 +42,7 @@
 #include <cstdint>
 #include <memory>
 #include <string>
+#include <vector>
 
 using VizBridgeBench::LiveBytes;
 
@@ -47,7 +52,7 @@ using KolbaVizCore::SceneBuilder;
 using VizBridgeTarvex::VizProductStructure;
 
 constexpr unsigned int kReferences = 1000;
-constexpr unsigned int kPMIPerReference = 50;
+constexpr unsigned int kPMIPerReference = 50; ///< unless a benchmark's argument says otherwise
 constexpr unsigned int kInstancesPerReference = 10;
 constexpr double kSpacing = 200.0; ///< between instances, beyond a reference's PMI
 
@@ -59,33 +64,32 @@ VizPort::WString Named(char const* stem, unsigned int number) {
     return VizPort::Widen(name);
 }
 
-/// 50 notes side by side along x, each a polyline over (2k, 0, 0) (2k + 1, 0, 0)
+/// `count` notes side by side along x, each a polyline over (2k, 0, 0) (2k + 1, 0, 0)
 /// (2k + 1, 1, 0).
-TarvexAuthoredVisuData const& PMI() {
-    static TarvexAuthoredVisuData const data = [] {
-        TarvexAuthoredVisuData made;
-        made.unit = TarvexLengthUnit_Millimeter;
-        for (unsigned int k = 0; k < kPMIPerReference; ++k) {
-            TarvexAuthoredVisuNode& note = made.nodes.emplace_back();
-            note.type = TarvexVisuNode::VisuNote;
-            note.pmi.id = Named("note", k);
-            TarvexAuthoredVisuEdge& line = note.pmi.edges.emplace_back();
-            float const x = 2.0f * static_cast<float>(k);
-            line.points = {x, 0, 0, x + 1, 0, 0, x + 1, 1, 0};
-        }
-        return made;
-    }();
-    return data;
+TarvexAuthoredVisuData PMI(unsigned int count) {
+    TarvexAuthoredVisuData made;
+    made.unit = TarvexLengthUnit_Millimeter;
+    for (unsigned int k = 0; k < count; ++k) {
+        TarvexAuthoredVisuNode& note = made.nodes.emplace_back();
+        note.type = TarvexVisuNode::VisuNote;
+        note.pmi.id = Named("note", k);
+        TarvexAuthoredVisuEdge& line = note.pmi.edges.emplace_back();
+        float const x = 2.0f * static_cast<float>(k);
+        line.points = {x, 0, 0, x + 1, 0, 0, x + 1, 1, 0};
+        line.lineIndices = std::vector<int>{0, 3, 6}; // float offsets of the points
+    }
+    return made;
 }
 
-/// `perReference` root instances of each reference, imported with their PMI.
-std::unique_ptr<VizProductStructure> MakeProduct(unsigned int perReference) {
+/// `perReference` root instances of each reference, imported with `pmi` PMI objects each.
+std::unique_ptr<VizProductStructure> MakeProduct(unsigned int perReference,
+                                                 unsigned int pmi = kPMIPerReference) {
+    TarvexAuthoredVisuData const data = PMI(pmi);
     TarvexModel model;
     model.SetProductName(u"PmiRenderBench");
     model.SetUnits(TarvexLengthUnit_Millimeter);
     for (unsigned int reference = 1; reference <= kReferences; ++reference)
-        model.AddPart(reference, VizPort::Widen(std::to_string(reference).insert(0, "Part"))).visu =
-            PMI();
+        model.AddPart(reference, Named("Part", reference)).visu = data;
     for (unsigned int copy = 0; copy < perReference; ++copy) {
         for (unsigned int reference = 1; reference <= kReferences; ++reference) {
             TarvexPlacement placement;
@@ -114,8 +118,8 @@ std::unique_ptr<SceneBuilder> MakeScene() {
 }
 
 /// Heap growth of one render of a product with `perReference` instances of each reference.
-std::int64_t RenderGrowth(unsigned int perReference) {
-    std::unique_ptr<VizProductStructure> const structure = MakeProduct(perReference);
+std::int64_t RenderGrowth(unsigned int perReference, unsigned int pmi) {
+    std::unique_ptr<VizProductStructure> const structure = MakeProduct(perReference, pmi);
     std::unique_ptr<SceneBuilder> const scene = MakeScene();
     auto const renderer =
         VizBridgeTarvex::MakeUniqueRenderer(structure.get(), nullptr, scene.get());
@@ -125,9 +129,17 @@ std::int64_t RenderGrowth(unsigned int perReference) {
 }
 
 void BM_RenderPMI(benchmark::State& state) {
-    std::unique_ptr<VizProductStructure> const structure = MakeProduct(kInstancesPerReference);
-    std::int64_t const growthOne = RenderGrowth(1);
-    std::int64_t const growthAll = RenderGrowth(kInstancesPerReference);
+    auto const pmi = static_cast<unsigned int>(state.range(0));
+    std::unique_ptr<VizProductStructure> const structure = MakeProduct(kInstancesPerReference, pmi);
+    std::size_t imported = 0;
+    for (auto const& [id, container] : structure->GetAllVizPMIContainers())
+        imported += container ? container->GetVizPMIs().size() : 0;
+    if (imported != std::size_t{kReferences} * pmi) {
+        state.SkipWithError("the PMI was not imported");
+        return;
+    }
+    std::int64_t const growthOne = RenderGrowth(1, pmi);
+    std::int64_t const growthAll = RenderGrowth(kInstancesPerReference, pmi);
     if (growthOne == 0 || growthAll == 0) {
         state.SkipWithError("a render failed");
         return;
@@ -143,16 +155,31 @@ void BM_RenderPMI(benchmark::State& state) {
         renderer.reset(); // removes its nodes from the scene
         state.ResumeTiming();
     }
-    state.counters["pmi_per_second"] =
-        benchmark::Counter(static_cast<double>(state.iterations()) * kReferences * kPMIPerReference,
-                           benchmark::Counter::kIsRate);
+    state.counters["pmi_per_second"] = benchmark::Counter(
+        static_cast<double>(state.iterations()) * kReferences * pmi, benchmark::Counter::kIsRate);
     state.counters["bytes_per_further_instance"] =
         static_cast<double>(growthAll - growthOne) /
         static_cast<double>(kReferences * (kInstancesPerReference - 1));
 }
-BENCHMARK(BM_RenderPMI)->Unit(benchmark::kMillisecond)->Iterations(3);
+// 5 and 50 PMI a reference: a further instance must cost the same whatever the PMI holds.
+BENCHMARK(BM_RenderPMI)->Arg(5)->Arg(50)->Unit(benchmark::kMillisecond)->Iterations(3);
 
-void BM_PickVisual(benchmark::State& state) {
+/// Ray `index` of a run: down through the first segment of note (index % 50) of an instance
+/// that moves on by a prime step, so that the rays spread over the product.
+KolbaVizCore::Ray RayNumber(std::int64_t index) {
+    std::int64_t const instance = (index * 7919) % (kReferences * kInstancesPerReference);
+    KolbaVizCore::Ray ray;
+    ray.origin[0] = kSpacing * static_cast<double>(instance % kReferences) +
+                    2.0 * static_cast<double>(index % kPMIPerReference) + 0.5;
+    ray.origin[1] = kSpacing * static_cast<double>(instance / kReferences);
+    ray.origin[2] = 10.0;
+    ray.direction[2] = -1.0;
+    return ray;
+}
+
+/// Picks in the rendered product: with `wholeQuestion`, what a host asks of the structure
+/// (PickVisual); without, the scene library's pick of a node alone, for comparison.
+void PickInRenderedProduct(benchmark::State& state, bool wholeQuestion) {
     std::unique_ptr<VizProductStructure> const structure = MakeProduct(kInstancesPerReference);
     std::unique_ptr<SceneBuilder> const scene = MakeScene();
     KolbaVizCore::View3DAdapter adapter(nullptr, scene.get());
@@ -166,26 +193,33 @@ void BM_PickVisual(benchmark::State& state) {
     std::int64_t rays = 0;
     std::int64_t hits = 0;
     for (auto _ : state) {
-        // Down through the first segment of note (rays % 50) of an instance that moves on
-        // by a prime step, so that the rays spread over the product.
-        std::int64_t const instance = (rays * 7919) % (kReferences * kInstancesPerReference);
-        KolbaVizCore::Ray ray;
-        ray.origin[0] = kSpacing * static_cast<double>(instance % kReferences) +
-                        2.0 * static_cast<double>(rays % kPMIPerReference) + 0.5;
-        ray.origin[1] = kSpacing * static_cast<double>(instance / kReferences);
-        ray.origin[2] = 10.0;
-        ray.direction[2] = -1.0;
-        VizBridgeTarvex::VizElement* element = nullptr;
-        VizBridgeTarvex::VizPSEntry* entry = nullptr;
-        if (structure->PickVisual(&adapter, ray, element, entry) && element)
-            ++hits;
-        ++rays;
+        KolbaVizCore::Ray const ray = RayNumber(rays++);
+        if (wholeQuestion) {
+            VizBridgeTarvex::VizElement* element = nullptr;
+            VizBridgeTarvex::VizPSEntry* entry = nullptr;
+            if (structure->PickVisual(&adapter, ray, element, entry) && element && entry)
+                ++hits;
+        } else {
+            KolbaVizCore::RenderId picked;
+            double distance = 0.0;
+            if (scene->Pick(ray, picked, distance))
+                ++hits;
+        }
     }
     state.counters["picks_per_second"] =
         benchmark::Counter(static_cast<double>(rays), benchmark::Counter::kIsRate);
     state.counters["hit_ratio"] = rays == 0 ? 0.0 : static_cast<double>(hits) / rays;
 }
+
+void BM_PickVisual(benchmark::State& state) {
+    PickInRenderedProduct(state, true);
+}
 BENCHMARK(BM_PickVisual)->Unit(benchmark::kMillisecond)->Iterations(20);
+
+void BM_SceneNodePick(benchmark::State& state) {
+    PickInRenderedProduct(state, false);
+}
+BENCHMARK(BM_SceneNodePick)->Unit(benchmark::kMillisecond)->Iterations(20);
 
 } // namespace
 

@@ -2,12 +2,14 @@
 #include "support/RenderFixture.h"
 
 #include <VizBridge/contracts/kolba/ConstructionContext.h>
+#include <VizBridge/contracts/kolba/Ray.h>
 #include <VizBridge/contracts/kolba/SceneContext.h>
 #include <VizBridge/contracts/kolba/SceneLevelContext.h>
 #include <VizBridge/contracts/kolba/VizCapture.h>
 #include <VizBridge/contracts/kolba/VizPMI.h>
 #include <VizBridge/contracts/kolba/VizPMIContainer.h>
 #include <VizBridge/contracts/kolba/VizView.h>
+#include <VizBridge/model/VizPSEntry.h>
 #include <VizBridge/render/PmiRenderer.h>
 
 #include <gtest/gtest.h>
@@ -343,4 +345,55 @@ TEST(PmiRenderer, APartInstancedTwiceDrawsItsPMIOnceAndTheSecondInstanceReferenc
     float box[6];
     renderer.GetGeometryBox(box);
     EXPECT_EQ(boxText(box), "(10 0 0)-(31 1 1)");
+}
+
+TEST(PmiRenderer, APickFindsTheElementAndTheInstanceUnderTheRayThroughEitherInstance) {
+    std::unique_ptr<VizProductStructure> const structure = plate();
+    VizProductStructureTestPeer::addPMIContainer(*structure, 10, makeContainer({}).release());
+    RenderScene scene;
+    ASSERT_TRUE(scene.builder.SetPickTolerance(0.1));
+    TarvexRendererProbe renderer(structure.get(), &scene.builder, nullptr);
+    ASSERT_TRUE(renderer.Render());
+
+    struct PickCase {
+        char const* name;
+        double x, y;          ///< a ray straight down from z 10
+        char const* element;  ///< its type and id; "" for none
+        char const* instance; ///< "" for none
+    };
+    // P.1 stands at x 10, P.2 at x 20, Q.1 at x 30. A P holds a triangle over (0,0) (1,0)
+    // (0,1), the note's line from (0,0) to (2,0), the dimension's from (4,0) to (6,0), all at
+    // z 0, and the FTA wire from (0,0) to (0,1) at z 1.
+    PickCase const cases[] = {
+        {"the FTA wire above the triangle", 20, 0.5, "VizWire 30", "P.2"},
+        {"the note's line beside the triangle", 21.5, 0, "VizPMI 10", "P.2"},
+        {"the dimension of the first instance", 15, 0, "VizPMI 20", "P.1"},
+        {"the triangle alone", 20.3, 0.3, "VizMesh 12", "P.2"},
+        {"nothing", 50, 50, "", ""},
+    };
+    for (PickCase const& c : cases) {
+        SCOPED_TRACE(c.name);
+        KolbaVizCore::Ray ray;
+        ray.origin[0] = c.x;
+        ray.origin[1] = c.y;
+        ray.origin[2] = 10;
+        ray.direction[2] = -1;
+        VizElement* element = nullptr;
+        VizPSEntry* entry = nullptr;
+        EXPECT_EQ(structure->PickVisual(&scene.adapter, ray, element, entry),
+                  *c.element != '\0' || *c.instance != '\0');
+        EXPECT_EQ(element ? element->GetElementType() + " " + std::to_string(element->GetID())
+                          : std::string(),
+                  c.element);
+        EXPECT_EQ(entry ? VizPort::Narrow(entry->GetInstanceName()) : std::string(), c.instance);
+    }
+
+    // Without a view nothing is asked and nothing is touched.
+    VizElement* const element = structure->GetVizPMIContainer(10)->GetVizPMIs().front();
+    VizPSEntry* const entry = structure->GetChildren().front();
+    VizElement* elementOut = element;
+    VizPSEntry* entryOut = entry;
+    EXPECT_FALSE(structure->PickVisual(nullptr, KolbaVizCore::Ray(), elementOut, entryOut));
+    EXPECT_EQ(elementOut, element);
+    EXPECT_EQ(entryOut, entry);
 }
