@@ -23,12 +23,12 @@ bool AVizContainer::pickAmong(AView3DAdapter* view, Ray const& ray,
     VizElement* best = nullptr;
     int bestLength = -1;
     for (VizElement* const candidate : candidates) {
-        RenderId path;
-        if (candidate == nullptr || !candidate->Get3DRenderID(path))
+        RenderId const* const path = candidate ? candidate->Find3DRenderID() : nullptr;
+        if (path == nullptr)
             continue;
-        if (path.Length() > bestLength && picked.BeginsWith(path)) {
+        if (path->Length() > bestLength && picked.BeginsWith(*path)) {
             best = candidate;
-            bestLength = path.Length();
+            bestLength = path->Length();
         }
     }
     if (best == nullptr)

@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 #include <sstream>
 #include <unordered_set>
 #include <utility>
@@ -97,9 +98,75 @@ Matrix4 placed(Matrix4 const& parentWorld, Node const& node) {
     return node.HasTransform() ? parentWorld * node.GetTransform() : parentWorld;
 }
 
+/// The corners of `box` placed by `transform`, as a box again.
+VizBox placedBox(Matrix4 const& transform, VizBox const& box) {
+    VizBox placedCorners;
+    if (box.IsEmpty())
+        return placedCorners;
+    for (int corner = 0; corner < 8; ++corner) {
+        double const point[3] = {(corner & 1 ? box.GetHigh() : box.GetLow())[0],
+                                 (corner & 2 ? box.GetHigh() : box.GetLow())[1],
+                                 (corner & 4 ? box.GetHigh() : box.GetLow())[2]};
+        double out[3];
+        transform.ApplyToPoint(point, out);
+        placedCorners.Add(out);
+    }
+    return placedCorners;
+}
+
+/// The box of everything below `node` (its items, children and references, shown or not),
+/// in the node's own coordinates. Each node's box is made once per cache: a drawing shown
+/// through many references is measured once.
+VizBox const& subtreeBox(Node const& node, SceneBuilder::PickBoxes& cache) {
+    if (auto const found = cache.find(&node); found != cache.end())
+        return found->second;
+    VizBox box;
+    Matrix4 const identity;
+    for (std::size_t index = 0; index < node.GetItemCount(); ++index)
+        node.GetItem(index)->AddToBox(identity, box);
+    auto const addBelow = [&](Node const& below) {
+        VizBox const& inner = subtreeBox(below, cache);
+        box.Add(below.HasTransform() ? placedBox(below.GetTransform(), inner) : inner);
+    };
+    for (std::size_t index = 0; index < node.GetChildCount(); ++index)
+        addBelow(*node.GetChild(index));
+    for (std::size_t index = 0; index < node.GetReferenceCount(); ++index)
+        addBelow(*node.GetReference(index));
+    return cache.emplace(&node, box).first->second; // references to elements outlive rehashes
+}
+
+/// Whether `ray` passes through `box` widened by `margin` on every side, ahead of its origin.
+bool rayMeetsBox(Ray const& ray, VizBox const& box, double margin) {
+    if (box.IsEmpty())
+        return false;
+    double enter = 0.0;
+    double leave = std::numeric_limits<double>::infinity();
+    for (int axis = 0; axis < 3; ++axis) {
+        double const low = box.GetLow()[axis] - margin;
+        double const high = box.GetHigh()[axis] + margin;
+        double const origin = ray.origin[axis];
+        double const direction = ray.direction[axis];
+        if (direction == 0.0) {
+            if (origin < low || origin > high)
+                return false;
+            continue;
+        }
+        double near = (low - origin) / direction;
+        double far = (high - origin) / direction;
+        if (near > far)
+            std::swap(near, far);
+        enter = std::max(enter, near);
+        leave = std::min(leave, far);
+        if (enter > leave)
+            return false;
+    }
+    return true;
+}
+
 struct PickState {
     Ray const& ray;
     double tolerance = 0.0;
+    SceneBuilder::PickBoxes& boxes;
     bool found = false;
     double nearest = 0.0;
     RenderId hit;
@@ -108,8 +175,11 @@ struct PickState {
 void pickBelow(Node const& node, Matrix4 const& parentWorld, RenderId& path, PickState& state) {
     if (!node.IsVisible())
         return;
-    path.AddValue(node.GetTag());
     Matrix4 const world = placed(parentWorld, node);
+    // A subtree the ray passes by is not looked into: most of a large scene is.
+    if (!rayMeetsBox(state.ray, placedBox(world, subtreeBox(node, state.boxes)), state.tolerance))
+        return;
+    path.AddValue(node.GetTag());
     for (std::size_t index = 0; index < node.GetItemCount(); ++index) {
         double t = 0.0;
         // Strictly nearer only: of two equal hits the one met first stands.
@@ -350,7 +420,11 @@ bool SceneBuilder::Pick(Ray const& ray, RenderId& hit, double& distance) const {
                   ray.direction[2] * ray.direction[2]);
     if (!(length > 0.0) || !std::isfinite(length))
         return false;
-    PickState state{ray, m_pickTolerance, false, 0.0, RenderId(1)};
+    if (m_pickBoxesRevision != m_revision) {
+        m_pickBoxes.clear();
+        m_pickBoxesRevision = m_revision;
+    }
+    PickState state{ray, m_pickTolerance, m_pickBoxes, false, 0.0, RenderId(1)};
     RenderId path(1);
     Matrix4 const identity;
     for (std::size_t index = 0; index < m_anchor->GetChildCount(); ++index)

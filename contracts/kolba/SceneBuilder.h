@@ -7,11 +7,13 @@
 #include <VizBridge/contracts/kolba/RGBAColor.h>
 #include <VizBridge/contracts/kolba/RenderId.h>
 #include <VizBridge/contracts/kolba/RenderingOptions.h>
+#include <VizBridge/contracts/kolba/VizBox.h>
 #include <VizBridge/contracts/platform/WString.h>
 
 #include <cstdint>
 #include <memory>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 namespace KolbaVizCore {
@@ -137,6 +139,9 @@ public:
     /// Counts the changes to the scene (nodes, items, placements, colours, visibility,
     /// references, the pick tolerance), so that a view may keep an answer while it stays.
     std::uint64_t GetRevision() const { return m_revision; }
+
+    /// The boxes of the subtrees that picks look into, each in its node's coordinates.
+    using PickBoxes = std::unordered_map<Node const*, VizBox>;
     /// About three pixels' width on a hand-sized part modelled in millimetres that fills a
     /// screen: lines can be hit with a mouse without a neighbour a few millimetres off
     /// catching the ray. A host that knows its camera sets the width of a few pixels instead.
@@ -173,6 +178,9 @@ private:
 
     std::unique_ptr<Node> m_anchor; ///< owns the scene tops; no node of the scene
     std::uint64_t m_revision = 0;
+    /// Made by the picks for the scene as it stood at m_pickBoxesRevision.
+    mutable PickBoxes m_pickBoxes;
+    mutable std::uint64_t m_pickBoxesRevision = 0;
     std::vector<Node*> m_open; ///< open levels, oldest first; owned through m_anchor
     int m_constructionDepth = 0;
     RenderingOptions m_options;

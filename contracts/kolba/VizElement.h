@@ -55,6 +55,9 @@ public:
             id = m_renderId;
         return m_hasRenderId;
     }
+    /// The render id without a copy, null until the element has been drawn: for the scene
+    /// library's own searches over many elements.
+    RenderId const* Find3DRenderID() const { return m_hasRenderId ? &m_renderId : nullptr; }
 
     void SetEntityID(EntityId const& id) {
         m_entityId = id;

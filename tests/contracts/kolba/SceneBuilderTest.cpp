@@ -1,4 +1,5 @@
 #include <VizBridge/contracts/kolba/SceneBuilder.h>
+#include <VizBridge/contracts/kolba/View3DAdapter.h>
 
 #include <VizBridge/contracts/kolba/AGeometryItemFactory.h>
 #include <VizBridge/contracts/kolba/BodyContext.h>
@@ -292,6 +293,37 @@ TEST(SceneBuilder, PicksTheNearestShownTriangleThroughReferencesAndPlacements) {
     EXPECT_EQ(picked(builder, 15, 10, -2), "1: 1 3000 at 5") << "the cover's line";
     EXPECT_EQ(picked(builder, 20.8, 10, -2), "miss") << "outside the hypotenuse";
     EXPECT_EQ(picked(builder, 20.2, 10, 0), "miss") << "a ray without direction";
+}
+
+// Picks keep what they measured of the scene while it stays as it was: each change must be
+// seen by the next pick, the adapter's kept answer included.
+TEST(SceneBuilder, PicksFollowTheSceneAsItChanges) {
+    SceneBuilder builder;
+    buildScene(builder);
+    View3DAdapter adapter(nullptr, &builder);
+    auto const viaAdapter = [&adapter](double x) {
+        RenderId drawn;
+        if (!adapter.PickDrawnRenderId(Ray{{x, 0.3, 10.0}, {0.0, 0.0, -1.0}}, drawn))
+            return std::string("miss");
+        std::string text;
+        for (std::uint32_t const tag : drawn.GetTags())
+            text += ' ' + std::to_string(tag);
+        return text;
+    };
+    EXPECT_EQ(picked(builder, 10.2, 10, -2), "1: 1 77 1000 10007 10006 12 at 10");
+    EXPECT_EQ(viaAdapter(20.2), " 1 3000") << "the cover";
+    ASSERT_TRUE(builder.RemoveNode(pathOf({R, 3000})));
+    EXPECT_EQ(viaAdapter(20.2), " 1 77 1000 10007 10006 12") << "P.2 shows P.1's drawing";
+    {
+        SceneContext scene(&builder, R, u"ROOT");
+        SceneLevelContext moved(&builder, 4000, u"Moved");
+        placeAt(builder, 40);
+        addTriangle(builder, 9, 0.0f);
+    }
+    EXPECT_EQ(picked(builder, 40.2, 10, -2), "1: 1 4000 at 10") << "a node added after a pick";
+    ASSERT_TRUE(builder.RemoveNode(pathOf({R, 77, 1000})));
+    EXPECT_EQ(picked(builder, 10.2, 10, -2), "miss");
+    EXPECT_EQ(viaAdapter(20.2), "miss") << "the reference went with its target";
 }
 
 // Tolerance 0.25; rays straight down from z = 10 unless said otherwise.
