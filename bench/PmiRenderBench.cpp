@@ -105,6 +105,7 @@ std::unique_ptr<VizProductStructure> MakeProduct(unsigned int perReference,
     std::unique_ptr<VizProductStructure> structure =
         VizBridgeTarvex::MakeUniqueVizProductStructure(result, input, document);
     VizBridgeTarvex::VizBuilder builder(*structure, input, nullptr);
+    // PMI comes with the tessellated data; the parts' tessellated containers stay empty.
     builder.SetImportVisu(true);
     builder.SetImportPMI(true);
     builder.ImportAndBuildPS();
