@@ -17,6 +17,7 @@
 #include <map>
 #include <memory>
 #include <regex>
+#include <stdexcept>
 #include <string>
 
 using namespace VizBridgeTarvex;
@@ -396,4 +397,32 @@ TEST(PmiRenderer, APickFindsTheElementAndTheInstanceUnderTheRayThroughEitherInst
     EXPECT_FALSE(structure->PickVisual(nullptr, KolbaVizCore::Ray(), elementOut, entryOut));
     EXPECT_EQ(elementOut, element);
     EXPECT_EQ(entryOut, entry);
+}
+
+namespace {
+
+/// Breaks the walk when it reaches its second part, after the first part's PMI was drawn.
+void throwAtSecondPart(int const& done, int const&, char const* phase) {
+    if (std::string(phase) == "RenderPart" && done == 2)
+        throw std::runtime_error("walk broke");
+}
+
+} // namespace
+
+TEST(PmiRenderer, ARenderThatFailsHalfwayKeepsItsPMIRenderersForTheNextRenderOrTheEnd) {
+    std::unique_ptr<VizProductStructure> const structure = plate();
+    VizProductStructureTestPeer::addPMIContainer(*structure, 10, makeContainer({}).release());
+    RenderScene scene;
+    {
+        TarvexRendererProbe renderer(structure.get(), &scene.builder, nullptr);
+        renderer.SetProgressCallback(&throwAtSecondPart);
+        EXPECT_FALSE(renderer.Render());
+        ASSERT_EQ(renderer.pmiRenderers().size(), 1u) << "made before the walk broke";
+        renderer.SetProgressCallback(nullptr);
+        ASSERT_TRUE(renderer.Render()); // the broken drawing gives way to a whole one
+        EXPECT_EQ(renderer.pmiRenderers().size(), 1u);
+        std::string const dump = scene.builder.Dump();
+        EXPECT_EQ(dump.find("10005 type \"PMI\""), dump.rfind("10005 type \"PMI\""));
+    } // the renderer frees each PMI renderer once, which the sanitized run checks
+    EXPECT_EQ(scene.builder.GetNodeCount(), 1u) << "only the scene's ROOT stays";
 }
