@@ -15,9 +15,9 @@
 #include <VizBridge/contracts/kolba/VizWire.h>
 #include <VizBridge/contracts/platform/FormatW.h>
 #include <VizBridge/model/BoxTransform.h>
+#include <VizBridge/model/SameRenderId.h>
 #include <VizBridge/model/VizPSEntry.h>
 #include <VizBridge/model/VizProductStructure.h>
-#include <VizBridge/model/SameRenderId.h>
 #include <VizBridge/services/UniqueServices.h>
 #include <VizBridge/services/VizModelerServices.h>
 
