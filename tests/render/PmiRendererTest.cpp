@@ -426,3 +426,21 @@ TEST(PmiRenderer, ARenderThatFailsHalfwayKeepsItsPMIRenderersForTheNextRenderOrT
     } // the renderer frees each PMI renderer once, which the sanitized run checks
     EXPECT_EQ(scene.builder.GetNodeCount(), 1u) << "only the scene's ROOT stays";
 }
+
+TEST(PmiRenderer, WithoutAContainerOrABuilderItDrawsNothingAndStillAnswers) {
+    RenderScene scene;
+    PmiRenderer noContainer(nullptr, nullptr, &scene.builder, nullptr, false);
+    EXPECT_TRUE(noContainer.Render());
+    EXPECT_TRUE(noContainer.GetRenderId().IsEmpty());
+    EXPECT_EQ(scene.builder.GetNodeCount(), 0u);
+
+    std::unique_ptr<VizPMIContainer> const container = makeContainer({});
+    PmiRenderer noBuilder(container.get(), nullptr, nullptr, nullptr, false);
+    EXPECT_TRUE(noBuilder.Render());
+    EXPECT_TRUE(noBuilder.ViewsRenderId().IsEmpty() && noBuilder.PMIElements().empty());
+    EntityId entity;
+    RenderId path;
+    EXPECT_FALSE(noBuilder.Convert(RenderId(), entity));
+    EXPECT_FALSE(noBuilder.Convert(entity, path));
+    noBuilder.ClearAll();
+}
