@@ -194,36 +194,16 @@ void PmiRenderer::renderVizPMI(KolbaVizCore::VizPMI& pmi, VizBox& box,
     applyTransform(transformation);
 
     KolbaVizCore::RenderingOptions const& options = builder->GetRenderingOptions();
-    if (!edges.empty()) {
-        SceneLevelContext const level(builder, KolbaVizCore::Edge, u"PMI Edges");
-        if (level.IsOK()) {
-            for (KolbaVizCore::VizEdge* const edge : edges) {
-                if (!edge)
-                    continue;
-                RGBAColor color = options.GetDefaultEdgeColor();
-                bool const own = getVizColor(*edge, color);
-                KolbaVizCore::EntityContext const context(
-                    builder, static_cast<std::uint32_t>(edge->GetID()), u"PMI Edge", own, color);
-                if (context.IsOK())
-                    renderVizEdge(*edge, box, color);
-            }
-        }
-    }
-    if (!faces.empty()) {
-        SceneLevelContext const level(builder, KolbaVizCore::Face, u"PMI Faces");
-        if (level.IsOK()) {
-            for (KolbaVizCore::VizFace* const face : faces) {
-                if (!face)
-                    continue;
-                RGBAColor color = options.GetDefaultFaceColor();
-                bool const own = getVizColor(*face, color);
-                KolbaVizCore::EntityContext const context(
-                    builder, static_cast<std::uint32_t>(face->GetID()), u"PMI Face", own, color);
-                if (context.IsOK())
-                    renderVizFace(*face, box, color);
-            }
-        }
-    }
+    renderPieces(edges, KolbaVizCore::Edge, u"PMI Edges", u"PMI Edge",
+                 options.GetDefaultEdgeColor(),
+                 [&](KolbaVizCore::VizEdge const& edge, RGBAColor const& color) {
+                     renderVizEdge(edge, box, color);
+                 });
+    renderPieces(faces, KolbaVizCore::Face, u"PMI Faces", u"PMI Face",
+                 options.GetDefaultFaceColor(),
+                 [&](KolbaVizCore::VizFace const& face, RGBAColor const& color) {
+                     renderVizFace(face, box, color);
+                 });
     if (!texts.empty()) {
         SceneLevelContext const level(builder, KolbaVizCore::Text, u"PMI Text Objects");
         if (level.IsOK()) {
@@ -234,6 +214,28 @@ void PmiRenderer::renderVizPMI(KolbaVizCore::VizPMI& pmi, VizBox& box,
     }
     if (pmi.GetHidden())
         builder->SetVisibility(false);
+}
+
+template <typename Piece, typename Draw>
+void PmiRenderer::renderPieces(std::vector<Piece*> const& pieces, EntityType const type,
+                               char16_t const* levelName, char16_t const* pieceName,
+                               RGBAColor const& defaultColor, Draw const& draw) {
+    if (pieces.empty())
+        return;
+    SceneBuilder* const builder = getSceneBuilder();
+    SceneLevelContext const level(builder, type, levelName);
+    if (!level.IsOK())
+        return;
+    for (Piece* const piece : pieces) {
+        if (!piece)
+            continue;
+        RGBAColor color = defaultColor;
+        bool const own = getVizColor(*piece, color);
+        KolbaVizCore::EntityContext const context(
+            builder, static_cast<std::uint32_t>(piece->GetID()), pieceName, own, color);
+        if (context.IsOK())
+            draw(*piece, color);
+    }
 }
 
 RenderId PmiRenderer::renderViews() {

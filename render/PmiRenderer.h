@@ -88,6 +88,11 @@ private:
     void forgetDrawing();
     /// Records `element` under the entity id of the current path, and gives it both ids.
     void recordAtCurrentPath(VizElement& element, std::map<EntityId, VizElement const*>& map);
+    /// The edges or faces of a PMI object: one level node, one coloured entity node each.
+    template <typename Piece, typename Draw>
+    void renderPieces(std::vector<Piece*> const& pieces, KolbaVizCore::EntityType type,
+                      char16_t const* levelName, char16_t const* pieceName,
+                      RGBAColor const& defaultColor, Draw const& draw);
     template <typename Collection>
     RenderId renderCollections(KolbaVizCore::EntityType type, char16_t const* name,
                                std::vector<Collection*> const& collections,
