@@ -21,6 +21,7 @@
 //                   PickVisual asks once: what the rest of PickVisual costs beside it.
 // Heap bytes are those requested from operator new.
 
+#include "support/BenchProduct.h"
 #include "support/LiveBytes.h"
 #include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
 #include <VizBridge/contracts/kolba/Ray.h>
@@ -99,29 +100,13 @@ std::unique_ptr<VizProductStructure> MakeProduct(unsigned int perReference,
                 .placement = placement;
         }
     }
-    TarvexPSImportResult const result = model.GetImportResult();
-    TarvexInputProductStructure const input = model.GetInputProductStructure();
-    TarvexDocument document = model.GetDocument();
-    std::unique_ptr<VizProductStructure> structure =
-        VizBridgeTarvex::MakeUniqueVizProductStructure(result, input, document);
-    VizBridgeTarvex::VizBuilder builder(*structure, input, nullptr);
-    // PMI comes with the tessellated data; the parts' tessellated containers stay empty.
-    builder.SetImportVisu(true);
-    builder.SetImportPMI(true);
-    builder.ImportAndBuildPS();
-    return structure;
-}
-
-std::unique_ptr<SceneBuilder> MakeScene() {
-    auto builder = std::make_unique<SceneBuilder>();
-    builder->SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
-    return builder;
+    return VizBridgeBench::ImportTessellated(model, true);
 }
 
 /// Heap growth of one render of a product with `perReference` instances of each reference.
 std::int64_t RenderGrowth(unsigned int perReference, unsigned int pmi) {
     std::unique_ptr<VizProductStructure> const structure = MakeProduct(perReference, pmi);
-    std::unique_ptr<SceneBuilder> const scene = MakeScene();
+    std::unique_ptr<SceneBuilder> const scene = VizBridgeBench::MakeScene();
     auto const renderer =
         VizBridgeTarvex::MakeUniqueRenderer(structure.get(), nullptr, scene.get());
     std::int64_t const before = LiveBytes();
@@ -145,7 +130,7 @@ void BM_RenderPMI(benchmark::State& state) {
         state.SkipWithError("a render failed");
         return;
     }
-    std::unique_ptr<SceneBuilder> const scene = MakeScene();
+    std::unique_ptr<SceneBuilder> const scene = VizBridgeBench::MakeScene();
     for (auto _ : state) {
         auto renderer = VizBridgeTarvex::MakeUniqueRenderer(structure.get(), nullptr, scene.get());
         if (!renderer->Render()) {
@@ -182,7 +167,7 @@ KolbaVizCore::Ray RayNumber(std::int64_t index) {
 /// (PickVisual); without, the scene library's pick of a node alone, for comparison.
 void PickInRenderedProduct(benchmark::State& state, bool wholeQuestion) {
     std::unique_ptr<VizProductStructure> const structure = MakeProduct(kInstancesPerReference);
-    std::unique_ptr<SceneBuilder> const scene = MakeScene();
+    std::unique_ptr<SceneBuilder> const scene = VizBridgeBench::MakeScene();
     KolbaVizCore::View3DAdapter adapter(nullptr, scene.get());
     scene->SetView3DAdapter(&adapter);
     auto const renderer =

@@ -27,6 +27,7 @@
 // measured once for the whole run. Heap bytes are those requested from operator new; the
 // allocator's own overhead is not counted.
 
+#include "support/BenchProduct.h"
 #include "support/LiveBytes.h"
 #include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
 #include <VizBridge/contracts/kolba/Node.h>
@@ -124,22 +125,7 @@ std::unique_ptr<VizProductStructure> MakeProduct(unsigned int instances) {
             .placement = placement;
     }
 
-    TarvexPSImportResult const result = model.GetImportResult();
-    TarvexInputProductStructure const input = model.GetInputProductStructure();
-    TarvexDocument document = model.GetDocument();
-    std::unique_ptr<VizProductStructure> structure =
-        VizBridgeTarvex::MakeUniqueVizProductStructure(result, input, document);
-    VizBuilder builder(*structure, input, nullptr);
-    builder.SetImportVisu(true);
-    builder.ImportAndBuildPS();
-    return structure;
-}
-
-/// A builder with the default item factory and no view.
-std::unique_ptr<SceneBuilder> MakeScene() {
-    auto builder = std::make_unique<SceneBuilder>();
-    builder->SetGeometryItemFactory(std::make_unique<KolbaVizCore::DefaultGeometryItemFactory>());
-    return builder;
+    return VizBridgeBench::ImportTessellated(model, false);
 }
 
 std::unique_ptr<TarvexRenderer> MakeRenderer(VizProductStructure& structure,
@@ -181,7 +167,7 @@ SceneCount CountScene(SceneBuilder const& builder) {
 std::int64_t OneInstanceEachGrowth() {
     static std::int64_t const growth = [] {
         std::unique_ptr<VizProductStructure> const structure = MakeProduct(kReferences);
-        std::unique_ptr<SceneBuilder> const builder = MakeScene();
+        std::unique_ptr<SceneBuilder> const builder = VizBridgeBench::MakeScene();
         std::unique_ptr<TarvexRenderer> const renderer = MakeRenderer(*structure, *builder);
         std::int64_t const before = LiveBytes();
         bool const rendered = renderer->Render();
@@ -201,7 +187,7 @@ void BM_Render(benchmark::State& state) {
         return;
     }
     std::unique_ptr<VizProductStructure> const structure = MakeProduct(instances);
-    std::unique_ptr<SceneBuilder> const builder = MakeScene();
+    std::unique_ptr<SceneBuilder> const builder = VizBridgeBench::MakeScene();
     std::unique_ptr<TarvexRenderer> const renderer = MakeRenderer(*structure, *builder);
 
     std::int64_t growth = 0;
