@@ -7,6 +7,7 @@
 #include <VizBridge/contracts/kolba/SceneBuilder.h>
 #include <VizBridge/contracts/kolba/SceneLevelContext.h>
 
+#include <algorithm>
 #include <cmath>
 #include <initializer_list>
 #include <string>
@@ -114,9 +115,28 @@ bool BrepPartRenderer::Convert(EntityId const& entity, RenderId& id) {
     // A refused level left its entities out of the scene: no path for them.
     if (builder->FindNode(path) == nullptr)
         return false;
-    path.SetLeading(1);
-    id = std::move(path);
+    RenderId relative(1);
+    for (int index = omittedHead(); index < path.Length(); ++index)
+        relative.AddValue(path[index]);
+    id = std::move(relative);
     return true;
+}
+
+RenderId BrepPartRenderer::InScene(RenderId const& relative) const {
+    if (GetRenderId().IsEmpty())
+        return RenderId();
+    RenderId path(1);
+    for (int index = 0; index < omittedHead(); ++index)
+        path.AddValue(GetRenderId()[index]);
+    for (std::uint32_t const tag : relative.GetTags())
+        path.AddValue(tag);
+    return path;
+}
+
+int BrepPartRenderer::omittedHead() const {
+    // The scene top and the product node; never the part node itself.
+    constexpr int kSceneAndProduct = 2;
+    return std::min(kSceneAndProduct, GetRenderId().Length() - 1);
 }
 
 bool BrepPartRenderer::ConvertToHighlight(RenderId const& id, RenderId*& ids, int& count) {

@@ -64,10 +64,18 @@ public:
     /// parent at index base + 2, the id at index base + 4 if the path reaches it, else at
     /// base + 2. False, and `entity` untouched, for any other path.
     bool Convert(KolbaVizCore::RenderId const& id, KolbaVizCore::EntityId& entity) override;
-    /// The path of the node drawn for a face, an edge or the body of this part, as the
-    /// first Convert gives them. False, and `id` untouched, for another entity or one whose
-    /// node was not drawn.
+    /// The node drawn for a face, an edge or the body of this part (the entities the first
+    /// Convert gives), as a path from the product's child that the drawing stands below: the
+    /// path without the scene top and the product node (leading word 1). A part is drawn once
+    /// and shown under every instance of it, so the caller places the path: a PMI renderer
+    /// below the root instance that was picked, the product renderer below the drawing
+    /// (skipping the levels the path repeats), a host with InScene. A drawing that hangs
+    /// right below the scene top keeps its own tag in front. False, and `id` untouched, for
+    /// another entity or one whose node was not drawn.
     bool Convert(KolbaVizCore::EntityId const& entity, KolbaVizCore::RenderId& id) override;
+    /// The scene path of a path that the second Convert gave, as drawn. Empty while nothing
+    /// is drawn.
+    KolbaVizCore::RenderId InScene(KolbaVizCore::RenderId const& relative) const;
     /// A path into the drawing highlights itself: a new array of one path, which the caller
     /// releases with delete[]. False for a path that does not lead into the drawing.
     bool ConvertToHighlight(KolbaVizCore::RenderId const& id, KolbaVizCore::RenderId*& ids,
@@ -109,6 +117,8 @@ private:
     void drawBrep(KolbaVizCore::SceneBuilder& builder) const;
     /// The part node, while the drawing is in the scene; null otherwise.
     KolbaVizCore::Node const* partNode() const;
+    /// How many tags of the drawing's path the second Convert leaves out.
+    int omittedHead() const;
     /// Whether `id` leads to a node at or below the part node, directly or through a node
     /// that references it.
     bool leadsIntoDrawing(KolbaVizCore::RenderId const& id) const;

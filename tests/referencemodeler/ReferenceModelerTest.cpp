@@ -4,6 +4,7 @@
 #include "support/TestPartContainer.h"
 #include <VizBridge/contracts/kolba/PolygonItem.h>
 #include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
+#include <VizBridge/modelerkit/BrepPartRenderer.h>
 #include <VizBridge/referencemodeler/ReferenceBrepRenderer.h>
 
 #include <gtest/gtest.h>
@@ -238,8 +239,9 @@ TEST_F(ReferenceBrepRendererTest, ConvertsPathsAndEntitiesOfItsOwnDrawingBothWay
             continue;
         RenderId back;
         ASSERT_TRUE(renderer->Convert(*c.entity, back));
-        EXPECT_EQ(back.GetLeading(), 1u);
-        EXPECT_EQ(builder.FindNode(back),
+        EXPECT_TRUE(back.GetLeading() == 1u && back[0] == 1000u) << "from the root instance";
+        auto const& drawing = dynamic_cast<VizModelerKit::BrepPartRenderer const&>(*renderer);
+        EXPECT_EQ(builder.FindNode(drawing.InScene(back)),
                   builder.FindNode(c.entity->GetType() == Body ? InPart(1000, PinId) : c.path));
     }
     EntityId entity;

@@ -13,6 +13,7 @@
 #include <VizBridge/contracts/tarvex/TarvexMultiProcess.h>
 #include <VizBridge/contracts/tarvex/TarvexPartImportResult.h>
 #include <VizBridge/import/VizBuilder.h>
+#include <VizBridge/modelerkit/BrepPartRenderer.h>
 #include <VizBridge/render/UniqueRenderer.h>
 #include <VizBridge/stepinput/OcctModelerServices.h>
 #include <VizBridge/stepinput/OcctPartContainer.h>
@@ -208,7 +209,9 @@ TEST(OcctModeler, MeshesAFaceWithoutTrianglesOnACopyAndConvertsItsPathsBothWays)
         EntityId const entity(7, KolbaVizCore::Face, face);
         KolbaVizCore::RenderId path;
         EntityId back;
-        ASSERT_TRUE(renderer->Convert(entity, path) && renderer->Convert(path, back));
+        ASSERT_TRUE(renderer->Convert(entity, path));
+        path = dynamic_cast<VizModelerKit::BrepPartRenderer const&>(*renderer).InScene(path);
+        ASSERT_TRUE(renderer->Convert(path, back));
         EXPECT_EQ(back, entity);
         auto const& item =
             dynamic_cast<KolbaVizCore::PolygonItem const&>(*scene.FindNode(path)->GetItem(0));
