@@ -99,6 +99,8 @@ bool TarvexRenderer::Render() {
             failed = true;
             message = "Unhandled Exception";
         }
+        // Also after a failure: what the walk recorded answers the conversions.
+        m_linkMap.Finish();
         reportProgress(total == 0 ? 1 : total, total == 0 ? 1 : total, "RenderEnd");
     }
     if (failed) {
@@ -113,18 +115,6 @@ bool TarvexRenderer::Render() {
 void TarvexRenderer::ClearAll() {
     cleanPSData();
     clearBase();
-}
-
-bool TarvexRenderer::Convert(RenderId const&, EntityId&) {
-    return false;
-}
-
-bool TarvexRenderer::Convert(EntityId const&, RenderId&) {
-    return false;
-}
-
-bool TarvexRenderer::ConvertToHighlight(RenderId const&, RenderId*&, int&) {
-    return false;
 }
 
 void TarvexRenderer::ExplodeView(double const& x, double const& y, double const& z) {
@@ -167,7 +157,7 @@ void TarvexRenderer::cleanPSData() {
     m_geometryRenderMap.clear();
     m_brepRenderMap.clear();
     m_productTag = 0;
-    m_linkMap.clear();
+    m_linkMap.Clear();
     m_level = 0;
     m_multipleRoots = false;
 }

@@ -2,6 +2,7 @@
 
 #include <VizBridge/contracts/platform/RecursiveLock.h>
 #include <VizBridge/render/AVizRenderer.h>
+#include <VizBridge/render/LinkMap.h>
 #include <VizBridge/render/PmiRenderer.h>
 #include <VizBridge/render/RenderedGeometry.h>
 
@@ -27,6 +28,9 @@ class VizPSEntry;
 /// nodes from the scene.
 class TarvexRenderer : public AVizRenderer {
 public:
+    /// The type of the part records among the instance records; no entity type has it.
+    static constexpr std::uint32_t PartRecordType = 40000;
+
     /// A new renderer, owned by the caller; null for a null structure, which cannot be
     /// rendered. `services` and `builder` stay the caller's; either may be null (without
     /// services no BREP is drawn and boxes are only moved, not exploded).
@@ -49,10 +53,21 @@ public:
     /// Removes the drawing and the sub-renderers, and forgets the box.
     void ClearAll() override;
 
-    /// Not built yet: the id conversions are still to come, so these answer false.
+    /// The entity a picked path names: PMI through the PMI renderers, a BREP entity through
+    /// the modeler, a tessellated body, or else the deepest instance or part recorded above
+    /// the node. False, with `entity` default, for a path of no recorded node.
     bool Convert(RenderId const& id, EntityId& entity) override;
+    /// The path of an entity: the product, PMI, a tessellated body, an instance or part
+    /// record, or a BREP body through the modeler's renderers. False, with `id` empty (or
+    /// the modeler renderer's path, if one answered without placing it), otherwise.
     bool Convert(EntityId const& entity, RenderId& id) override;
+    /// What to light up for a pick: for PMI the object and what it is linked to (several
+    /// paths), otherwise one path: the body or instance above the pick. `ids` is a new
+    /// array that the caller releases with delete[].
     bool ConvertToHighlight(RenderId const& id, RenderId*& ids, int& count) override;
+    /// PMI as its renderer tells it; a face, edge or vertex as "Face with ID: <id>\nParent
+    /// Body ID: <body>"; empty for anything else.
+    WString GetToolTip(RenderId const& id) override;
 
     /// Stored only; they act on the boxes of the next render.
     void ExplodeView(double const& x, double const& y, double const& z);
@@ -82,10 +97,14 @@ protected:
     bool renderPartPMI(int const& id, VizTransf const& transformation, VizBox& box);
     RenderId renderGeom(VizContainer const& container, VizBox& box);
 
+    // The id conversions.
+    bool convertToHighlightPart(RenderId const& id, RenderId*& ids, int& count);
+    bool convertBREP(RenderId const& id, EntityId& entity);
+
     // Read by the id conversions.
     VizProductStructure* productStructure() const { return m_productStructure; }
     bool hasMultipleRoots() const { return m_multipleRoots; }
-    std::map<EntityId, RenderId> const& linkMap() const { return m_linkMap; }
+    LinkMap const& linkMap() const { return m_linkMap; }
     std::map<int, RenderedGeometry> const& brepRenderMap() const { return m_brepRenderMap; }
     std::map<int, RenderedGeometry> const& geometryRenderMap() const { return m_geometryRenderMap; }
     std::map<int, std::unique_ptr<KolbaVizCore::ARenderer>>& brepRenderers() {
@@ -105,6 +124,9 @@ private:
     /// Moves a drawn box by the instance's placement and the explode factors into `box`.
     void finishBox(VizTransf const& transformation, VizBox const& local, VizBox& box);
     void reportProgress(int done, int total, char const* phase) const;
+    /// The path of a BREP body through the modeler's renderers, placed below the drawing of
+    /// the renderer that answered when its path does not run through the product node.
+    bool convertBREPBody(EntityId const& entity, RenderId& id);
 
     VizProductStructure* m_productStructure; ///< not owned
     RenderId m_productRenderId;
@@ -117,7 +139,8 @@ private:
     std::map<int, RenderedGeometry> m_pmiRenderMap;
     /// Per reference id, the renderer of its PMI container, made on its first instance.
     std::map<int, std::unique_ptr<PmiRenderer>> m_pmiRenderers;
-    std::map<EntityId, RenderId> m_linkMap;
+    /// Instances and parts by entity id; sorted once the walk is done.
+    LinkMap m_linkMap;
     int m_level = 0;
     bool m_colorOverride = false;
     RGBAColor m_overrideColor;

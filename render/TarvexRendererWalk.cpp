@@ -33,8 +33,6 @@ using KolbaVizCore::SceneBuilder;
 namespace {
 
 constexpr std::uint32_t kProductContainerType = 1;
-/// The type of the part records in the link map; no entity type has this value.
-constexpr std::uint32_t kPartRecordType = 40000;
 constexpr unsigned long kTagsPerLevel = 1000;
 constexpr std::size_t kBodyNameBufferSize = 64;
 
@@ -196,7 +194,7 @@ void TarvexRenderer::getTransformation(VizPSEntry const& entry, VizTransf& out) 
 void TarvexRenderer::addToLinkMap(VizPSEntry* entry, unsigned long const& tag, RenderId const& id) {
     std::uint32_t const parent = id.Length() >= 2 ? id[id.Length() - 2] : 0;
     EntityId const key(parent, KolbaVizCore::Link, static_cast<std::uint32_t>(tag));
-    m_linkMap.emplace(key, id); // the first instance met keeps its key
+    m_linkMap.Add(key, id); // the first instance met keeps its key
     if (!entry)
         return;
     entry->Set3DRenderID(id);
@@ -207,7 +205,7 @@ void TarvexRenderer::addToLinkMap(VizPSEntry* entry, unsigned long const& tag, R
 
 void TarvexRenderer::addToPartMap(VizPSEntry*, unsigned long const& tag, RenderId const& id) {
     auto const value = static_cast<std::uint32_t>(tag);
-    m_linkMap.emplace(EntityId(value, kPartRecordType, value), id);
+    m_linkMap.Add(EntityId(value, PartRecordType, value), id);
 }
 
 bool TarvexRenderer::referenceRecorded(RenderId const& recorded, bool& referenced) {
