@@ -4,6 +4,7 @@
 #include "ContainerReport.h"
 #include "PmiViewing.h"
 #include "SampleAssembly.h"
+#include "ViewerQuestions.h"
 
 #include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
 #include <VizBridge/contracts/kolba/RecordingView3D.h>
@@ -188,13 +189,36 @@ void ViewPMI(VizProductStructure& structure, KolbaVizCore::SceneBuilder const& s
         VizBridgeExamples::ActivateAndPrint(std::cout, structure, *pmi);
 }
 
+/// Step 6: what a viewer asks the renderer about picked nodes: entity ids both ways, the
+/// paths to highlight and the tool tips. With BREP the ray down onto the Bracket's top meets
+/// a modeler face; with tessellated data a mesh face, and the ray along y the dimension.
+void AskViewerQuestions(VizProductStructure const& structure,
+                        VizBridgeTarvex::TarvexRenderer& renderer,
+                        KolbaVizCore::SceneBuilder const& scene,
+                        KolbaVizCore::AView3DAdapter& view) {
+    std::cout << "Viewer questions:\n";
+    using VizBridgeExamples::MakeRay;
+    VizBridgeExamples::PrintViewerQuestions(std::cout, renderer, scene, view,
+                                            "the face down onto the Bracket's top",
+                                            MakeRay({50, 15, 200}, {0, 0, -1}));
+    VizBridgeExamples::PrintViewerQuestions(std::cout, renderer, scene, view, "the dimension line",
+                                            MakeRay({30, -100, 70}, {0, 1, 0}));
+    // The first instance of the first root: the Bracket assembly's node.
+    if (!structure.GetChildren().empty() && structure.GetChildren().front()) {
+        KolbaVizCore::RenderId instance;
+        if (structure.GetChildren().front()->Get3DRenderID(instance))
+            VizBridgeExamples::PrintViewerQuestions(std::cout, renderer, scene,
+                                                    "the instance BracketAssembly.1", instance);
+    }
+}
+
 /// Step 4: a renderer draws the structure into the host's scene. The host keeps the scene
 /// builder, the view and the modeler (if any) alive for as long as the renderer lives;
 /// deleting the renderer removes what it drew. `printScene`: print the whole scene tree.
 /// `viewPMI`: print the PMI part of the scene, pick along two rays and activate the
-/// Bracket's capture and view.
+/// Bracket's capture and view. `ask`: ask the viewer questions of step 6.
 void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModelerServices* modeler,
-                     bool printScene, bool viewPMI, RoadSummary& summary) {
+                     bool printScene, bool viewPMI, bool ask, RoadSummary& summary) {
     KolbaVizCore::RecordingView3D view;
     KolbaVizCore::SceneBuilder scene;
     KolbaVizCore::View3DAdapter adapter(&view, &scene);
@@ -217,6 +241,8 @@ void RenderStructure(VizProductStructure& structure, VizBridgeTarvex::VizModeler
                   << sphere.center[2] << "), radius " << sphere.radius << '\n';
     if (viewPMI)
         ViewPMI(structure, scene, adapter);
+    if (ask)
+        AskViewerQuestions(structure, *renderer, scene, adapter);
 
     renderer->ClearAll();
     std::cout << "After ClearAll: " << scene.GetNodeCount() << " node(s)\n";
@@ -250,7 +276,7 @@ RoadSummary RunRoad(VizBridgeExamples::SampleAssembly const& sample, int process
     PrintFailures(*structure);
     PrintTimes(times);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, &modeler, true, false, summary);
+    RenderStructure(*structure, &modeler, true, false, processors == 1, summary);
 
     // The structure goes last: after the builder and every renderer made on it.
     structure.reset();
@@ -293,7 +319,7 @@ RoadSummary RunVisualisationRoad(VizBridgeExamples::SampleAssembly const& sample
     PrintContainers(*structure);
     PrintFailures(*structure);
     std::cout << "Rendering\n";
-    RenderStructure(*structure, nullptr, false, !tesselateText, summary);
+    RenderStructure(*structure, nullptr, false, !tesselateText, !tesselateText, summary);
     structure.reset();
     return summary;
 }

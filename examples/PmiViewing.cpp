@@ -1,5 +1,7 @@
 #include "PmiViewing.h"
 
+#include "ViewerQuestions.h"
+
 #include <VizBridge/contracts/kolba/Ray.h>
 #include <VizBridge/contracts/kolba/VizCapture.h>
 #include <VizBridge/contracts/kolba/VizPMI.h>
@@ -56,11 +58,7 @@ void PrintPMIScene(std::ostream& out, std::string const& dump) {
 void PrintPick(std::ostream& out, VizBridgeTarvex::VizProductStructure const& structure,
                KolbaVizCore::AView3DAdapter& view, char const* what, double const (&origin)[3],
                double const (&direction)[3]) {
-    KolbaVizCore::Ray ray;
-    for (int axis = 0; axis < 3; ++axis) {
-        ray.origin[axis] = origin[axis];
-        ray.direction[axis] = direction[axis];
-    }
+    KolbaVizCore::Ray const ray = MakeRay(origin, direction);
     VizBridgeTarvex::VizElement* element = nullptr; // PickVisual wants both null
     VizBridgeTarvex::VizPSEntry* entry = nullptr;
     bool const found = structure.PickVisual(&view, ray, element, entry);
