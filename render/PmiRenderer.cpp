@@ -18,9 +18,13 @@
 #include <VizBridge/contracts/kolba/VizText.h>
 #include <VizBridge/contracts/kolba/VizView.h>
 #include <VizBridge/contracts/kolba/VizWire.h>
+#include <VizBridge/contracts/platform/DebugOutput.h>
+#include <VizBridge/contracts/platform/FormatW.h>
 
 #include <algorithm>
 #include <cmath>
+#include <memory>
+#include <string>
 
 namespace VizBridgeTarvex {
 
@@ -36,6 +40,7 @@ constexpr int kFTAMeshViewOption = 1;
 /// FTA meshes are drawn half transparent.
 constexpr int kFTAMeshAlpha = 128;
 constexpr unsigned int kPlaneRectangleFloats = 15;
+constexpr std::size_t kRefLineBufferSize = 1024;
 
 WString widened(std::string const& narrow) {
     return WString(narrow.begin(), narrow.end());
@@ -343,10 +348,7 @@ bool PmiRenderer::Convert(RenderId const& id, EntityId& entity) {
         return false;
     entity = EntityId();
     int const n = id.Length();
-    int last = 0;
-    for (int i = 0; i < n; ++i)
-        if (id[i] == KolbaVizCore::PMI)
-            last = i;
+    int const last = lastPMITag(id);
     auto const set = [&entity](std::uint32_t parent, std::uint32_t type, std::uint32_t value) {
         entity = EntityId(parent, type, value);
         return true;
@@ -391,8 +393,186 @@ bool PmiRenderer::Convert(EntityId const& entity, RenderId& id) {
     return true;
 }
 
-bool PmiRenderer::ConvertToHighlight(RenderId const&, RenderId*&, int&) {
+bool PmiRenderer::ConvertToHighlight(RenderId const& id, RenderId*& ids, int& count) {
+    for (std::uint32_t const tag : id.GetTags()) {
+        if (tag == KolbaVizCore::Views)
+            return convertToHighlightView(id, ids, count);
+        if (tag == KolbaVizCore::Captures)
+            return convertToHighlightCapture(id, ids, count);
+        if (tag == KolbaVizCore::PMI)
+            return convertToHighlightPMI(id, ids, count);
+    }
     return false;
+}
+
+bool PmiRenderer::convertToHighlightPMI(RenderId const& id, RenderId*& ids, int& count) {
+    unsigned long owner = kNoOwner;
+    if (!isOwned(id, owner))
+        return false;
+    count = 0;
+    int const last = lastPMITag(id);
+    if (id.Length() >= last + 3) {
+        // A pick below the object (an edge, a text) lights up the whole object.
+        RenderId object = id;
+        object.SetLength(last + 3);
+        object.SetLeading(1);
+        EntityId entity;
+        if (Convert(object, entity)) {
+            auto const found = m_pmiElements.find(entity);
+            if (found != m_pmiElements.end() && found->second)
+                getPMIRenderIDs(id, object, found->second, ids, count);
+            if (count != 0)
+                return true;
+        }
+    }
+    return handOver({id}, ids, count);
+}
+
+void PmiRenderer::getPMIRenderIDs(RenderId const& picked, RenderId const& parent,
+                                  VizElement const* element, RenderId*& ids, int& count) {
+    if (!element || !m_pmiContainer) {
+        handOver({parent}, ids, count);
+        return;
+    }
+    // Constructed geometry has no links: the caller falls back on the picked path.
+    if (element->GetElementType() != KolbaVizCore::VizPMI::TypeID())
+        return;
+    WString const mechanicalId =
+        static_cast<KolbaVizCore::VizPMI const*>(element)->GetMechanicalID();
+    std::vector<EntityId> entities;
+    m_pmiContainer->GetBREPLinks(mechanicalId, entities);
+    std::vector<WString> linked;
+    m_pmiContainer->GetPMILinks(mechanicalId, linked);
+
+    std::vector<RenderId> paths{parent};
+    if (m_ownerRenderer) {
+        constexpr int kInstanceHead = 3; // scene top, product, root instance
+        for (EntityId const& entity : entities) {
+            RenderId own;
+            // A linked entity the owner cannot place is left out: a path of the instance
+            // alone would light up the whole instance.
+            if (!m_ownerRenderer->Convert(entity, own) || own.IsEmpty())
+                continue;
+            own.SetLeading(1);
+            if (m_ownerPathsComplete) {
+                paths.push_back(own);
+                continue;
+            }
+            // The owner's path runs from the product's child down: below the picked one.
+            RenderId placed(1);
+            for (int index = 0; index < std::min(kInstanceHead, picked.Length()); ++index)
+                placed.AddValue(picked[index]);
+            for (int index = 1; index < own.Length(); ++index)
+                placed.AddValue(own[index]);
+            paths.push_back(placed);
+        }
+    }
+    for (WString const& pmiId : linked) {
+        VizPort::OutputDebugStringW(pmiId.c_str());
+        KolbaVizCore::SemanticPMI* record = nullptr;
+        RenderId path;
+        if (!m_pmiContainer->GetSemanticPMI(pmiId, record))
+            continue;
+        if (KolbaVizCore::VizPMI const* const other = m_pmiContainer->GetVizPMI(pmiId))
+            if (other->Get3DRenderID(path))
+                paths.push_back(path);
+    }
+    handOver(paths, ids, count);
+}
+
+bool PmiRenderer::convertToHighlightView(RenderId const& id, RenderId*& ids, int& count) {
+    return convertToHighlightCollection(id, m_viewElements, ids, count);
+}
+
+bool PmiRenderer::convertToHighlightCapture(RenderId const& id, RenderId*& ids, int& count) {
+    return convertToHighlightCollection(id, m_captureElements, ids, count);
+}
+
+bool PmiRenderer::convertToHighlightCollection(RenderId const& id,
+                                               std::map<EntityId, VizElement const*>& map,
+                                               RenderId*& ids, int& count) {
+    ids = nullptr;
+    count = 0;
+    EntityId entity;
+    if (!Convert(id, entity))
+        return false;
+    VizElement const* const element = map[entity]; // an unknown id stays as a null entry
+    if (!element)
+        return false;
+    auto const& collection = static_cast<KolbaVizCore::VizPMICollection const&>(*element);
+    RenderId* members = nullptr;
+    int memberCount = 0;
+    std::vector<RenderId> paths{id};
+    if (collection.GetMemberRenderIds(members, memberCount, false)) {
+        std::unique_ptr<RenderId[]> const owned(members); // handed to us; freed here
+        paths.insert(paths.end(), owned.get(), owned.get() + memberCount);
+    }
+    return handOver(paths, ids, count);
+}
+
+WString PmiRenderer::GetToolTip(RenderId const& id) {
+    EntityId entity;
+    if (!Convert(id, entity) || !m_pmiContainer)
+        return WString();
+    WString const reference =
+        VizPort::FormatW(kRefLineBufferSize, u"\nRefID : %d\n\n", {m_pmiContainer->GetRefID()});
+    std::uint32_t const type = entity.GetType();
+    WString text;
+    if (type >= KolbaVizCore::UnknownPMI && type <= KolbaVizCore::Roughness) {
+        auto const found = m_pmiElements.find(entity);
+        VizElement const* const element = found == m_pmiElements.end() ? nullptr : found->second;
+        std::string const kind = element ? element->GetElementType() : std::string();
+        if (kind == KolbaVizCore::VizPMI::TypeID()) {
+            auto const& pmi = static_cast<KolbaVizCore::VizPMI const&>(*element);
+            WString const own = pmi.ToString();
+            if (!own.empty())
+                text = own + reference;
+            WString semantic;
+            if (m_pmiContainer->GetSemanticPMIAsString(pmi.GetMechanicalID(), semantic))
+                text += semantic;
+        } else if (kind == KolbaVizCore::VizMesh::TypeID() ||
+                   kind == KolbaVizCore::VizWire::TypeID() ||
+                   kind == KolbaVizCore::VizPointSet::TypeID()) {
+            text +=
+                u"Constructed Geometry\nVisualID : " + element->GetVisualID() + u"\n" + reference;
+        }
+    }
+    bool const summary = entity.GetId() == entity.GetParentId() && entity.GetParentId() == type;
+    if (type == KolbaVizCore::Captures || type == KolbaVizCore::Views) {
+        bool const captures = type == KolbaVizCore::Captures;
+        if (summary) {
+            text += captures ? u"Captures" : u"Views";
+        } else {
+            auto const& map = captures ? m_captureElements : m_viewElements;
+            auto const found = map.find(entity);
+            if (found != map.end() && found->second) {
+                WString const own =
+                    captures ? static_cast<KolbaVizCore::VizCapture const&>(*found->second)
+                                   .GetCaptureAsString()
+                             : static_cast<KolbaVizCore::VizView const&>(*found->second)
+                                   .GetViewAsString();
+                if (!own.empty())
+                    text += own + reference;
+            }
+        }
+    }
+    return text;
+}
+
+int PmiRenderer::lastPMITag(RenderId const& id) {
+    int last = 0;
+    for (int i = 0; i < id.Length(); ++i)
+        if (id[i] == KolbaVizCore::PMI)
+            last = i;
+    return last;
+}
+
+bool PmiRenderer::handOver(std::vector<RenderId> const& paths, RenderId*& ids, int& count) {
+    auto array = std::make_unique<RenderId[]>(paths.size());
+    std::copy(paths.begin(), paths.end(), array.get());
+    ids = array.release(); // the interface makes the array the caller's
+    count = static_cast<int>(paths.size());
+    return true;
 }
 
 } // namespace VizBridgeTarvex

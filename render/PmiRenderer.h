@@ -55,8 +55,15 @@ public:
     /// The path of a recorded element; a summary key (id, parent id and type equal) gives
     /// the node above the element that stands for it. False, with `id` empty, otherwise.
     bool Convert(EntityId const& entity, RenderId& id) override;
-    /// Not built yet: highlighting of PMI is still to come, so this answers false.
+    /// What to light up for a pick in this renderer's drawing: for a PMI object the object,
+    /// then the model entities it is linked to (through the owner renderer, under the root
+    /// instance that was picked), then the PMI objects it refers to; for a view or capture
+    /// itself and its members. False for a path that is not this renderer's. `ids` is a new
+    /// array of `count` paths that the caller releases with delete[].
     bool ConvertToHighlight(RenderId const& id, RenderId*& ids, int& count) override;
+    /// The text for a picked PMI object, FTA element, view or capture, with the container's
+    /// reference id; empty for anything else.
+    WString GetToolTip(RenderId const& id) override;
 
     // Read by tests and by the highlighting.
     std::map<EntityId, VizElement const*> const& PMIElements() const { return m_pmiElements; }
@@ -83,7 +90,22 @@ protected:
     bool isOwned(RenderId const& id, unsigned long& owner);
     bool isOwned(unsigned long const& tag);
 
+    bool convertToHighlightPMI(RenderId const& id, RenderId*& ids, int& count);
+    bool convertToHighlightView(RenderId const& id, RenderId*& ids, int& count);
+    bool convertToHighlightCapture(RenderId const& id, RenderId*& ids, int& count);
+    /// The picked object's path (`parent`), the paths of what `element` is linked to.
+    void getPMIRenderIDs(RenderId const& picked, RenderId const& parent, VizElement const* element,
+                         RenderId*& ids, int& count);
+
 private:
+    /// A view or capture and its members; `map` is the one of its kind.
+    bool convertToHighlightCollection(RenderId const& id,
+                                      std::map<EntityId, VizElement const*>& map, RenderId*& ids,
+                                      int& count);
+    /// The index of the last "PMI" tag of `id`; 0 if it has none.
+    static int lastPMITag(RenderId const& id);
+    /// Hands `paths` to the caller as a new array, which the interface makes the caller's.
+    static bool handOver(std::vector<RenderId> const& paths, RenderId*& ids, int& count);
     /// Removes the views and captures and forgets the records; preRender and ClearAll.
     void forgetDrawing();
     /// Records `element` under the entity id of the current path, and gives it both ids.

@@ -1,4 +1,5 @@
 // The PMI scene: what PmiRenderer draws for one container, and what it records.
+#include "support/DebugCapture.h"
 #include "support/RenderFixture.h"
 
 #include <VizBridge/contracts/kolba/ConstructionContext.h>
@@ -443,4 +444,66 @@ TEST(PmiRenderer, WithoutAContainerOrABuilderItDrawsNothingAndStillAnswers) {
     EXPECT_FALSE(noBuilder.Convert(RenderId(), entity));
     EXPECT_FALSE(noBuilder.Convert(entity, path));
     noBuilder.ClearAll();
+}
+
+TEST(PmiRenderer, HighlightsAndToolTipsOfItsOwnPaths) {
+    std::unique_ptr<VizPMIContainer> const container = makeContainer({});
+    VizPMI& note = *container->GetVizPMIs()[0];
+    VizPMI& dimension = *container->GetVizPMIs()[1];
+    note.SetLinkedEntityMechIDs({u"pmi20", u"face7"}); // a PMI object and a model face
+    dimension.SetName(u"Length 60");
+    for (char16_t const* id : {u"pmi10", u"pmi20"}) {
+        auto record = std::make_unique<KolbaVizCore::SemanticPMI>();
+        record->ID = id;
+        container->AddSemanticPMI(record.release()); // the container owns it
+    }
+    container->GetViews()[0]->AddMember(u"pmi20");
+    PmiScene pmi(container.get());
+    ASSERT_TRUE(pmi.Render());
+    DebugCapture const debug;
+
+    constexpr std::uint32_t R = KolbaVizCore::Node::RootNodeId, P = KolbaVizCore::PMI,
+                            I = kInstanceTag;
+    std::string const semantic = "Name : \nLabel : \nID : pmi20\n";
+    struct Case {
+        RenderId picked;
+        std::vector<RenderId> highlight; ///< empty: not this renderer's
+        std::string tip;
+    };
+    Case const cases[] = {
+        // An edge of the note: the note, then the dimension it points at.
+        {pathOf({R, I, P, 10101, 10, 10001, 11}),
+         {pathOf({R, I, P, 10101, 10}), pathOf({R, I, P, 10103, 20})},
+         "Name : \nLabel : \nID : pmi10\n"},
+        {pathOf({R, I, P, 10103, 20}),
+         {pathOf({R, I, P, 10103, 20})},
+         "PMI : Length 60\nRefID : 5\n\n" + semantic},
+        {pathOf({R, I, P, 10103}),
+         {pathOf({R, I, P, 10103})},
+         "PMI : Length 60\nRefID : 5\n\n" + semantic},
+        {pathOf({R, I, P, 11000, 30}), {pathOf({R, I, P, 11000, 30})}, ""}, // no links: itself
+        {pathOf({R, I, KolbaVizCore::Views, 40}),
+         {pathOf({R, I, KolbaVizCore::Views, 40}), pathOf({R, I, P, 10103, 20})},
+         "View : Front\nRefID : 5\n\n"},
+        // The node of all views stands for the last one.
+        {pathOf({R, I, KolbaVizCore::Views}),
+         {pathOf({R, I, KolbaVizCore::Views}), pathOf({R, I, P, 10103, 20})},
+         "Views"},
+        {pathOf({R, I, KolbaVizCore::Captures, 50}),
+         {pathOf({R, I, KolbaVizCore::Captures, 50})},
+         "Capture : Saved\nRefID : 5\n\n"},
+        {pathOf({R, I + 1, P, 10103, 20}), {}, ""}, // another node's PMI
+    };
+    for (Case const& c : cases) {
+        SCOPED_TRACE(&c - cases);
+        RenderId* raw = nullptr;
+        int count = 0;
+        bool const highlighted = pmi.renderer.ConvertToHighlight(c.picked, raw, count);
+        std::unique_ptr<RenderId[]> const ids(raw); // the caller's, released as an array
+        EXPECT_EQ(std::vector<RenderId>(ids.get(), ids.get() + (highlighted ? count : 0)),
+                  c.highlight);
+        EXPECT_EQ(VizPort::Narrow(pmi.renderer.GetToolTip(c.picked)), c.tip);
+    }
+    EXPECT_EQ(debug.texts(), std::vector<VizPort::WString>{u"pmi20"})
+        << "each linked PMI id, once for the one highlight that follows links";
 }
