@@ -1,5 +1,6 @@
 // LinkMap against the walks it stands for: a std::map filled with emplace (the first path of
 // a key stays) and read in key order.
+#include "support/LinkMapWalk.h"
 #include <VizBridge/render/LinkMap.h>
 
 #include <gtest/gtest.h>
@@ -13,33 +14,7 @@ using namespace VizBridgeTarvex;
 
 namespace {
 
-using Records = std::map<EntityId, RenderId>;
-
-struct Answer {
-    bool found = false;
-    EntityId key;
-    RenderId path;
-    bool operator==(Answer const&) const = default;
-};
-
-Answer walkFirstWithId(Records const& records, std::uint32_t id) {
-    for (auto const& [key, path] : records)
-        if (key.GetId() == id)
-            return {true, key, path};
-    return {};
-}
-
-Answer walkLongestPrefix(Records const& records, RenderId const& id) {
-    Answer best;
-    for (auto const& [key, path] : records) {
-        RenderId head = id;
-        if (head.Length() > path.Length())
-            head.SetLength(path.Length());
-        if (head == path && (!best.found || path.Length() > best.path.Length()))
-            best = {true, key, path};
-    }
-    return best;
-}
+using namespace VizBridgeTest;
 
 std::vector<std::pair<EntityId, RenderId>> inOrder(Records const& records) {
     return {records.begin(), records.end()};
