@@ -146,10 +146,6 @@ std::vector<TarvexImportCall> TarvexModel::GetImportCalls() const {
     return m_data ? m_data->importLog.Get() : std::vector<TarvexImportCall>();
 }
 
-TarvexPMIAnnotation TarvexModel::MakeAnnotation(std::vector<TarvexEntity> linkedElements) const {
-    return TarvexPMIAnnotation(m_data, std::move(linkedElements));
-}
-
 TarvexPSImportResult TarvexModel::GetImportResult() const {
     return TarvexPSImportResult(m_data);
 }

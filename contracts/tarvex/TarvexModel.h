@@ -7,7 +7,7 @@
 #include <VizBridge/contracts/tarvex/TarvexFaultPlan.h>
 #include <VizBridge/contracts/tarvex/TarvexImportCall.h>
 #include <VizBridge/contracts/tarvex/TarvexLengthUnitType.h>
-#include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
+#include <VizBridge/contracts/tarvex/TarvexVisuContext.h>
 
 #include <memory>
 #include <optional>
@@ -90,8 +90,13 @@ public:
     /// ids from the top; empty: in the part itself).
     TarvexEntity MakeEntity(std::vector<unsigned int> instancePath, unsigned int entityId) const;
     TarvexEntity MakeEntity(TarvexAuthoredEntity entity) const;
-    /// An annotation linked to `linkedElements`.
-    TarvexPMIAnnotation MakeAnnotation(std::vector<TarvexEntity> linkedElements) const;
+    /// A PMI object of this model made from its record: `Object` is the value class, such as
+    /// TarvexPMIDimension for a TarvexAuthoredPMIDimension. Its operations ask the model's
+    /// fault plan, with the subject 0.
+    template <class Object, class Record> Object MakePMIObject(Record record) const {
+        return Object(TarvexVisuContext(m_data, 0),
+                      std::make_shared<Record const>(std::move(record)));
+    }
 
     // Visualisation data, authored in each reference's `visu` record.
     /// The directory in which the text builder looks for its font files; std::nullopt: the

@@ -3,6 +3,7 @@
 #include "support/ReferenceModelerFixture.h"
 #include "support/TestPartContainer.h"
 #include <VizBridge/contracts/kolba/PolygonItem.h>
+#include <VizBridge/contracts/tarvex/TarvexAuthoredPMI.h>
 #include <VizBridge/contracts/tarvex/TarvexPMIAnnotation.h>
 #include <VizBridge/modelerkit/BrepPartRenderer.h>
 #include <VizBridge/referencemodeler/ReferenceBrepRenderer.h>
@@ -102,7 +103,9 @@ TEST_F(ReferenceModelerScene, NamesTheFacesEdgesAndBodyOfItsOwnPartOnly) {
         EntityId out;
         named(expected, services.GetEntityId(p, entity, out), out);
     }
-    TarvexPMIAnnotation annotation = model.MakeAnnotation({model.MakeEntity({1}, 201)});
+    TarvexAuthoredPMIAnnotation linked;
+    linked.linkedElements = {TarvexAuthoredEntity{{1}, 201, std::nullopt, true}};
+    TarvexPMIAnnotation annotation = model.MakePMIObject<TarvexPMIAnnotation>(linked);
     for (std::optional<int> index :
          {std::optional(0), std::optional(1), std::optional(-1), std::optional<int>()}) {
         EntityId out;
