@@ -4,6 +4,7 @@
 #include "ContainerReport.h"
 #include "PmiViewing.h"
 #include "SampleAssembly.h"
+#include "SemanticReport.h"
 #include "ViewerQuestions.h"
 
 #include <VizBridge/contracts/kolba/DefaultGeometryItemFactory.h>
@@ -348,6 +349,11 @@ int main() {
         summaries.push_back(RunVisualisationRoad(sample, false));
         std::cout << "\n=== Visualisation data and PMI, texts tessellated\n";
         summaries.push_back(RunVisualisationRoad(sample, true));
+        std::cout << "\n=== Semantic PMI of the Bracket, one record per object\n";
+        VizBridgeExamples::PrintSemanticRecords(
+            std::cout, sample.GetModel(),
+            VizBridgeExamples::SamplePMI::Bracket(
+                VizBridgeExamples::SampleAssembly::kBracketFirstFaceId));
         PrintSummary(summaries);
         return 0;
     } catch (std::exception const& e) {

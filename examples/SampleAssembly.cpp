@@ -84,7 +84,7 @@ TarvexAuthoredVisuNode PMILeaf(TarvexVisuNode::TarvexVisuNodeType type, char16_t
     return node;
 }
 
-constexpr unsigned int kBracketFirstEntity = 100;
+constexpr unsigned int kBracketFirstEntity = SampleAssembly::kBracketFirstFaceId;
 constexpr unsigned int kBoltFirstEntity = 200;
 constexpr unsigned int kCoverFirstEntity = 300;
 SampleBox const kBracketBox(60, 20, 10);

@@ -23,6 +23,8 @@ public:
     static constexpr unsigned int kBracketId = 11;
     static constexpr unsigned int kBoltId = 12;
     static constexpr unsigned int kCoverId = 13;
+    /// The entity id of the Bracket's first face; its faces and edges follow.
+    static constexpr unsigned int kBracketFirstFaceId = 100;
 
     SampleAssembly();
 
