@@ -321,3 +321,22 @@ TEST(SemanticLoader, ExceptionLeavesTheKeysWrittenSoFar) {
         EXPECT_FALSE(out.Properties.count(VizPort::Widen(row.firstSkipped))) << row.firstSkipped;
     }
 }
+
+// Objects that a careless host made without a model or record read as empty objects: every
+// loader still gives a record, with the keys that are always written.
+TEST(SemanticLoader, DefaultObjectsReadAsEmptyObjects) {
+    std::vector<std::pair<std::string, std::string>> const rows = {
+        {load<VizGDTSemanticPMILoader>(TarvexPMIGDT()), "IsComposite : false\n"},
+        {load<VizNoteSemanticPMILoader>(TarvexPMINote()), "Flag Note : false\n"},
+        {load<VizDatumTargetSemanticPMILoader>(TarvexPMIDatumTarget(), WString(u"_0")),
+         "_0Upper : \n"},
+        {load<VizRoughnessSemanticPMILoader>(TarvexPMIRoughness()), "Count : 0\n"},
+        {load<VizViewSemanticPMILoader>(TarvexPMIAnnotationView()), "Hidden : false\n"},
+        {load<VizCapturePMILoader>(TarvexPMICapture()), "Manages_Geometry : 0\n"},
+        {load<VizDimensionSemanticPMILoader>(TarvexPMIDimension()), "Value : 0.000000\n"},
+    };
+    for (auto const& [record, key] : rows) {
+        EXPECT_EQ(record.rfind("Name : \nLabel : \nID : \n", 0), 0u) << record;
+        EXPECT_NE(record.find(key), std::string::npos) << record;
+    }
+}
